@@ -1,0 +1,13 @@
+// Tonvex: chord analysis and chord naming. Include this header to get the whole
+// public interface.
+#ifndef TONVEX_H
+#define TONVEX_H
+
+#include "ChordnamePref.h"
+#include "MySet.h"
+#include "Note.h"
+#include "NoteNames.h"
+#include "TonvexExport.h"
+#include "TonvexVersion.h"
+
+#endif

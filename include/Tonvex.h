@@ -3,7 +3,9 @@
 #ifndef TONVEX_H
 #define TONVEX_H
 
+#include "ChordTypes.h"
 #include "ChordnamePref.h"
+#include "IntvlSet.h"
 #include "MySet.h"
 #include "Note.h"
 #include "NoteNames.h"

@@ -5,9 +5,13 @@
 
 #include "ChordnamePref.h"
 #include "MySet.h"
+#include "NetProperties.h"
+#include "Neuron.h"
+#include "NeuronalNet.h"
 #include "Note.h"
 #include "NoteNames.h"
 #include "TonvexExport.h"
 #include "TonvexVersion.h"
+#include "TrainingPattern.h"
 
 #endif

@@ -71,7 +71,7 @@ public:
   /// Evaluates neurons[0..count-1] of one layer on the same n inputs; outputs[j]
   /// gets neuron j's output. When combined_type is 0 (INPUT_SUM, ACT_SIGM,
   /// OUTPUT_NONE) this is the fast single-precision path: the weighted sum in float
-  /// (in eight interleaved partial sums, so that it vectorises), expf for the
+  /// (in input order, as calcValue sums), expf for the
   /// exponential, which is also kept in cached_exp. Its results may differ from
   /// calcValue in the last bits. Any other combination evaluates each neuron with
   /// calcValue. Never allocates.

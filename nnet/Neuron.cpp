@@ -79,16 +79,12 @@ float Activation(float z) {
   return z;
 }
 
-// Weighted sum of the fast path. Eight partial sums let the compiler use vector
-// registers without reassociating; below eight inputs it is the plain ordered sum.
+// Weighted sum of the fast path, in input order like the reference evaluation, so
+// that the two differ only by the exponential's precision.
 float DotProduct(float const* x, float const* w, int n) {
-  float lane[8] = {};
-  int i = 0;
-  for (; i + 8 <= n; i += 8)
-    for (int k = 0; k < 8; ++k) lane[k] += x[i + k] * w[i + k];
-  float tail = 0.0f;
-  for (; i < n; ++i) tail += x[i] * w[i];
-  return ((lane[0] + lane[1]) + (lane[2] + lane[3])) + ((lane[4] + lane[5]) + (lane[6] + lane[7])) + tail;
+  float z = 0.0f;
+  for (int i = 0; i < n; ++i) z += x[i] * w[i];
+  return z;
 }
 
 } // namespace

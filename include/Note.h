@@ -85,6 +85,11 @@ public:
   void EnhShift() const;
   void EnhShiftToFlats() const;
   void EnhShiftToSharps() const;
+  /// Spells the note as the scale spells its key number (CScale::EnhForKeynr; a
+  /// negative key number reads the entry of its pitch class). The spelling is not
+  /// checked afterwards: a scale on a double-flat root can hand out a triple flat
+  /// (-1), which the note keeps until something calls CheckEnh.
+  void AdjustEnhToScale(CScale const& scale) const;
 
   /// "Undefined" for the undefined note, else KeyNrAndEnhToName of the key number.
   /// A negative key number is named by its pitch class.

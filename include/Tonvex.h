@@ -10,6 +10,8 @@
 #include "MySet.h"
 #include "Note.h"
 #include "NoteNames.h"
+#include "Scale.h"
+#include "SignKey.h"
 #include "TonvexExport.h"
 #include "TonvexVersion.h"
 

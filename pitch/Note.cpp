@@ -33,7 +33,8 @@ constexpr TEnh ToSharps[12][5] = {{N, N, s, s, s}, {f, s, s, X, X}, {N, N, X, X,
                                   {f, s, s, s, s}, {N, N, X, X, X}, {f, s, s, s, s}, {f, N, X, X, X}};
 
 // Spelling of each key number in the default scale (C major); a black key asked to
-// be natural takes it.
+// be natural takes it. A fixed table, so that checking a spelling never builds a
+// scale; the tests hold it equal to what CScale() computes.
 constexpr TEnh DefaultScaleEnh[12] = {N, s, N, f, N, N, s, N, f, N, f, N};
 
 } // namespace

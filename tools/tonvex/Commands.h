@@ -9,5 +9,7 @@
 using Args = std::vector<std::string>;
 
 int RunNoteCommand(Args const& args);
+int RunScaleCommand(Args const& args);
+int RunKeyCommand(Args const& args);
 
 #endif

@@ -12,6 +12,8 @@ const char* const Usage = "usage: tonvex COMMAND [ARGS...]\n"
                           "\n"
                           "Commands:\n"
                           "  note NAME...   read note names and show their numbers, spellings and names\n"
+                          "  scale ROOT TYPE  show a scale's spelled degrees and key signature\n"
+                          "  key ROOT [minor] show a key's name, key signature and degrees\n"
                           "\n"
                           "Options:\n"
                           "  --help         show this text\n"
@@ -44,6 +46,8 @@ int main(int argc, char** argv) {
     return 0;
   }
   if (command == "note") return RunNoteCommand(rest);
+  if (command == "scale") return RunScaleCommand(rest);
+  if (command == "key") return RunKeyCommand(rest);
   std::fprintf(stderr, "tonvex: unknown command '%s'\n%s", command.c_str(), Usage);
   return 2;
 }

@@ -1,0 +1,66 @@
+// The spelling table of a scale and its key signature.
+#include "Scale.h"
+
+#include "pitch/KeySignCount.h"
+
+namespace {
+
+// Key numbers of the letters C D E F G A B.
+constexpr int NoteNameToKeyNr[7] = {0, 2, 4, 5, 7, 9, 11};
+
+// By interval above the root: -1 spells the key number as the raised form of the
+// letter a semitone below, +1 as the lowered form of the letter a semitone above.
+constexpr int EnhOffset_stMaj[12] = {0, -1, 0, 1, 0, 0, -1, 0, 1, 0, 1, 0};
+constexpr int EnhOffset_stMin[12] = {0, 1, 0, 0, -1, 0, -1, 0, 0, -1, 0, -1};
+
+constexpr int LetterF = 3, LetterB = 6;
+
+// Reduces any key number (or sum of one with an offset) into 0..11.
+int PitchClass(int k) {
+  int r = k % 12;
+  return r < 0 ? r + 12 : r;
+}
+
+} // namespace
+
+void CScale::CalcEnh() {
+  // The key signature: sharps are added in the order F C G D A E B (a fifth up is
+  // four letters on), flats in the order B E A D G C F. Beyond seven signs a letter
+  // takes a second (and third) accidental.
+  int accidental[7] = {Enh_Natural, Enh_Natural, Enh_Natural, Enh_Natural, Enh_Natural, Enh_Natural, Enh_Natural};
+  int signs = SignsCount();
+  for (int n = 0, letter = LetterF; n < signs; ++n, letter = (letter + 4) % 7) ++accidental[letter];
+  for (int n = 0, letter = LetterB; n < -signs; ++n, letter = (letter + 3) % 7) --accidental[letter];
+
+  for (TEnh& e : Enh_) e = Enh_Natural;
+  for (int i = 0; i < 7; ++i)
+    Enh_[PitchClass(accidental[i] - Enh_Natural + NoteNameToKeyNr[i])] = static_cast<TEnh>(accidental[i]);
+
+  // The chromatic steps between the degrees borrow the spelling of a neighbouring
+  // degree. Interval 11 of a minor scale keeps what the key signature gave it.
+  int const* offset = Type_ == Scale_Minor ? EnhOffset_stMin : EnhOffset_stMaj;
+  int root = Root_.KeyNr();
+  for (int i = 0; i < 11; ++i) {
+    int k = PitchClass(root + i);
+    int j = PitchClass(k + offset[i]);
+    Enh_[k] = static_cast<TEnh>(Enh_[j] - offset[i]);
+  }
+}
+
+int CScale::SignsCount() const {
+  constexpr int Major = 1, Minor = 2;
+  CNote root = Root_; // the count may respell the note it is given
+  return KeySignCount(root, Type_ == Scale_Minor ? Minor : Major);
+}
+
+TEnh CScale::EnhForKeynr(int k) const { return Enh_[PitchClass(k)]; }
+
+TEnh CScale::EnhForNote(CNote const& note) const { return EnhForKeynr(note.KeyNr()); }
+
+void CScale::SetEnhForKeyNr(int k, TEnh enh) { Enh_[PitchClass(k)] = enh; }
+
+void CScale::SetEnhForNote(CNote const& note, TEnh enh) { SetEnhForKeyNr(note.KeyNr(), enh); }
+
+void CScale::SetEnhForChromStep(int step, TEnh enh) { SetEnhForKeyNr(Root_.KeyNr() + step % 12, enh); }
+
+void CNote::AdjustEnhToScale(CScale const& scale) const { Enh_ = scale.EnhForKeynr(KeyNr()); }

@@ -86,27 +86,32 @@ constexpr CXGRow XGRows[] = {{MaskOf(0, 4, 7), 0},         {MaskOf(0, 4, 7, 9), 
                              {MaskOf(0, 5, 7, 10), 20},    {MaskOf(0, 2, 7), 33},
                              {MaskOf(0, 7), 31},           {MaskOf(0), 30}};
 
-// XG number of each basic chord 0..7 where no row matches.
+// The basic chord of an interval cache, by the presence of each interval in any
+// octave, tested in this order.
+CChord::TBasicChord BasicChordOf(CIntvlMasks const& masks) {
+  auto has = [&masks](int x) { return masks.Has(x); };
+  if (has(4)) return (!has(8) || has(7)) ? CChord::bc_maj : CChord::bc_aug;
+  if (has(3)) {
+    if (has(6)) return (has(7) || has(10)) ? CChord::bc_min : CChord::bc_dim;
+    if (has(7) || !has(8)) return CChord::bc_min;
+    // A minor third with the augmented fifth and no fifth: judged as without a third.
+  }
+  if (!has(7)) return CChord::bc_none;
+  if (has(5)) return CChord::bc_sus4; // before the second: 0 2 5 7 is sus4
+  if (has(2)) return CChord::bc_sus2;
+  if (masks.IsExactly(MaskOf(0, 7)) || masks.IsExactly(MaskOf(0, 7, 12))) return CChord::bc_drone;
+  return CChord::bc_none;
+}
+
+// XG number of each basic chord 0..7 (all that BasicChordOf gives) where no row
+// matches; 34 is XG's "no chord".
 constexpr int XGFallbacks[] = {34, 0, 8, 7, 17, 32, 33, 31};
-constexpr int XGNoChord = 34;
 
 } // namespace
 
 CChord::TBasicChord CChord::BasicChord() const {
   RefreshIntvls();
-  CIntvlMasks masks(Intvls_);
-  auto has = [&masks](int x) { return masks.Has(x); };
-  if (has(4)) return (!has(8) || has(7)) ? bc_maj : bc_aug;
-  if (has(3)) {
-    if (has(6)) return (has(7) || has(10)) ? bc_min : bc_dim;
-    if (has(7) || !has(8)) return bc_min;
-    // A minor third with the augmented fifth and no fifth: judged as without a third.
-  }
-  if (!has(7)) return bc_none;
-  if (has(5)) return bc_sus4; // before the second: 0 2 5 7 is sus4
-  if (has(2)) return bc_sus2;
-  if (masks.IsExactly(MaskOf(0, 7)) || masks.IsExactly(MaskOf(0, 7, 12))) return bc_drone;
-  return bc_none;
+  return BasicChordOf(CIntvlMasks(Intvls_));
 }
 
 void CChord::SetBasicChord(TBasicChord bc) {
@@ -153,6 +158,5 @@ int CChord::XGChordIx() const {
   CIntvlMasks masks(Intvls_);
   for (CXGRow const& row : XGRows)
     if (masks.IsExactly(row.Intvls)) return row.XG;
-  TBasicChord bc = BasicChord();
-  return (bc >= bc_none && bc <= bc_drone) ? XGFallbacks[bc] : XGNoChord;
+  return XGFallbacks[BasicChordOf(masks)];
 }

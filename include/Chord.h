@@ -135,10 +135,10 @@ public:
   /// intervals become stale. Then the note's difference to the root is inserted into
   /// the interval cache unfolded (raised by octaves while negative, then folded by the
   /// wrap interval only), unlike a rebuild, which folds into 0..11: under a specified
-  /// root C4 and wrap 24, adding D5 puts 14 into the cache. A root specified before
-  /// the notes are added therefore never triggers a rebuild, and the cache (and the
-  /// lonely-lowest-note mark, which only a rebuild computes) stay as these inserts
-  /// leave them.
+  /// root C4 and wrap 24, adding D5 puts 14 into the cache. Adding notes under a root
+  /// specified before them therefore never triggers a rebuild: the cache, and the
+  /// lonely-lowest-note mark that only a rebuild computes, stay as these inserts
+  /// leave them until an edit marks the intervals stale.
   void AddNote(CNote const& note);
   /// Removes the note if present; the intervals become stale in any case, so the
   /// next query rebuilds them even when nothing was removed.

@@ -3,6 +3,7 @@
 // classification written out from the recognition rules as a first-match list, from
 // the XG rows read as data, and from the letter model of tests/support.
 #include "Chord.h"
+#include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
 
 #include <gtest/gtest.h>
@@ -14,7 +15,7 @@
 
 namespace {
 
-using Intvls = std::set<int>;
+using namespace chordtest;
 
 // ---- Independent model of the recognition ----------------------------------------
 
@@ -91,15 +92,12 @@ int XGByExactTest(CChord const& chord) {
   return XGFallback[chord.BasicChord()];
 }
 
-Intvls Members(CIntvlSet const& set) { return Intvls(set.begin(), set.end()); }
-
 // A chord over root C4 whose cache holds exactly `intvls` (values 0..23), inserted
 // directly: the root is specified before the notes are added.
 CChord DirectChord(Intvls const& intvls) {
-  CChord chord(24);
-  chord.SetRootNote(CNote(60, Enh_Natural));
-  for (int i : intvls) chord.AddNote(CNote(60 + i, Enh_Natural));
-  return chord;
+  std::vector<long> notes;
+  for (int i : intvls) notes.push_back(60 + i);
+  return RootedChord(60, notes);
 }
 
 void ExpectRecognised(CChord const& chord, Intvls const& expectedCache, std::string const& what) {
@@ -228,12 +226,6 @@ TEST(BasicChord, IntervalsAndScaleTypeOfEachBasicChord) {
 // Intervals of each basic chord, read from its definition.
 Intvls const BasicIntvls[] = {{}, {0, 4, 7}, {0, 3, 7}, {0, 4, 8}, {0, 3, 6}, {0, 5, 7}, {0, 2, 7}, {0, 7}};
 
-std::vector<long> NoteNrs(CChord const& chord) {
-  std::vector<long> nrs;
-  for (CNote const& n : chord.Notes()) nrs.push_back(n.NoteNr());
-  return nrs;
-}
-
 TEST(SetBasicChord, BuildsEveryBasicChordInTheCompingRange) {
   for (int bc = CChord::bc_maj; bc <= CChord::bc_drone; ++bc) {
     for (int root = 0; root < 12; ++root) {
@@ -283,8 +275,7 @@ TEST(SetBasicChord, MovesThirdsAndFifthsOfExistingNotes) {
       {{64, 67}, CChord::bc_min, {59, 64, 67}},               // E G over E: the fifth B is added in 53..64
   };
   for (Case const& c : cases) {
-    CChord chord(24);
-    for (long n : c.notes) chord.AddNote(CNote(n, Enh_Natural));
+    CChord chord = ChordOf(c.notes);
     chord.SetBasicChord(c.bc);
     SCOPED_TRACE("bc " + std::to_string(c.bc) + " from " + std::to_string(c.notes.size()) + " notes");
     EXPECT_EQ(NoteNrs(chord), c.result);
@@ -297,8 +288,7 @@ TEST(SetBasicChord, MovesThirdsAndFifthsOfExistingNotes) {
 }
 
 TEST(SetBasicChord, MinorFromMajorRespellsTheMovedThird) {
-  CChord chord(24);
-  for (long n : {60L, 64L, 67L}) chord.AddNote(CNote(n, Enh_Natural));
+  CChord chord = ChordOf({60, 64, 67});
   chord.SetBasicChord(CChord::bc_min);
   EXPECT_EQ(chord.Note(1), CNote(63, Enh_Flat));
   EXPECT_EQ(chord.Note(0), CNote(60, Enh_Natural));
@@ -314,16 +304,14 @@ TEST(SetBasicChord, NoneRemovesThirdsAndFifthFromTheCacheOnly) {
   EXPECT_EQ(Members(chord.IntvlSet()), (Intvls{0, 10}));
   EXPECT_EQ(chord.BasicChord(), CChord::bc_none);
   // On a stale cache the removal does not last: the next query rebuilds from notes.
-  CChord stale(24);
-  for (long n : {60L, 64L, 67L}) stale.AddNote(CNote(n, Enh_Natural));
+  CChord stale = ChordOf({60, 64, 67});
   stale.SetBasicChord(CChord::bc_none);
   EXPECT_EQ(Members(stale.IntvlSet()), (Intvls{0, 4, 7}));
 }
 
 TEST(SetBasicChord, ValuesOutsideTheEnumerationDoNothing) {
   for (int bc : {8, 9, 100, -1}) {
-    CChord chord(24);
-    for (long n : {60L, 63L, 68L}) chord.AddNote(CNote(n, Enh_Natural));
+    CChord chord = ChordOf({60, 63, 68});
     CChord before = chord;
     chord.SetBasicChord(static_cast<CChord::TBasicChord>(bc));
     EXPECT_EQ(chord, before) << bc;
@@ -338,8 +326,7 @@ TEST(SetBasicChord, ValuesOutsideTheEnumerationDoNothing) {
 int LetterIndex(char letter) { return static_cast<int>(std::string("CDEFGAB").find(letter)); }
 
 TEST(ChordScale, MinorSecondIsSpelledAsTheLoweredSecondDegree) {
-  CChord chord(24);
-  for (long n : {60L, 61L, 64L, 67L}) chord.AddNote(CNote(n, Enh_Natural));
+  CChord chord = ChordOf({60, 61, 64, 67});
   EXPECT_EQ(chord.Scale().EnhForKeynr(1), Enh_Flat); // D flat, not C sharp
   EXPECT_EQ(chord.IntvlIxToKeyName(1), "Db");
   chord.DelNote(CNote(61, Enh_Sharp));

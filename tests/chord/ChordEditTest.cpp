@@ -2,6 +2,7 @@
 // comping range and moving notes between intervals. Expected note numbers are
 // counted out by hand from the octave rules or found by searching a note range.
 #include "Chord.h"
+#include "support/ChordBuilders.h"
 
 #include <gtest/gtest.h>
 
@@ -12,32 +13,7 @@
 
 namespace {
 
-using Intvls = std::set<int>;
-
-Intvls Members(CIntvlSet const& set) { return Intvls(set.begin(), set.end()); }
-
-CNote Nat(long noteNr) { return CNote(noteNr, Enh_Natural); }
-
-CChord ChordOf(std::vector<long> const& noteNrs) {
-  CChord chord(24);
-  for (long n : noteNrs) chord.AddNote(Nat(n));
-  return chord;
-}
-
-// A chord under a specified root, notes added afterwards: its cache holds the direct
-// inserts and is not stale.
-CChord RootedChord(long root, std::vector<long> const& noteNrs) {
-  CChord chord(24);
-  chord.SetRootNote(Nat(root));
-  for (long n : noteNrs) chord.AddNote(Nat(n));
-  return chord;
-}
-
-std::vector<long> NoteNrs(CChord const& chord) {
-  std::vector<long> nrs;
-  for (CNote const& n : chord.Notes()) nrs.push_back(n.NoteNr());
-  return nrs;
-}
+using namespace chordtest;
 
 int PitchClass(long n) { return static_cast<int>(((n % 12) + 12) % 12); }
 

@@ -2,6 +2,7 @@
 // cache and its lonely-lowest-note mark, the key number queries, comparisons and the
 // undefined chord. Expectations are counted out by hand or from std::set models.
 #include "Chord.h"
+#include "support/ChordBuilders.h"
 
 #include <gtest/gtest.h>
 
@@ -12,17 +13,7 @@
 
 namespace {
 
-using Intvls = std::set<int>;
-
-Intvls Members(CIntvlSet const& set) { return Intvls(set.begin(), set.end()); }
-
-CNote Nat(long noteNr) { return CNote(noteNr, Enh_Natural); }
-
-CChord ChordOf(std::vector<long> const& noteNrs) {
-  CChord chord(24);
-  for (long n : noteNrs) chord.AddNote(Nat(n));
-  return chord;
-}
+using namespace chordtest;
 
 // ---- Construction ------------------------------------------------------------------
 

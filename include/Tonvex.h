@@ -8,11 +8,15 @@
 #include "ChordnamePref.h"
 #include "IntvlSet.h"
 #include "MySet.h"
+#include "NetProperties.h"
+#include "Neuron.h"
+#include "NeuronalNet.h"
 #include "Note.h"
 #include "NoteNames.h"
 #include "Scale.h"
 #include "SignKey.h"
 #include "TonvexExport.h"
 #include "TonvexVersion.h"
+#include "TrainingPattern.h"
 
 #endif

@@ -3,6 +3,7 @@
 #ifndef TONVEX_H
 #define TONVEX_H
 
+#include "Chord.h"
 #include "ChordTypes.h"
 #include "ChordnamePref.h"
 #include "IntvlSet.h"

@@ -1,0 +1,17 @@
+// The library's process-wide objects, defined in one translation unit so that they
+// are built in this order when the library is loaded: a later object may use the
+// earlier ones.
+#include "Chord.h"
+#include "Note.h"
+
+namespace {
+// Wrap interval of the undefined chord: the built-in chord analysis net's input
+// count, whose record replaces this constant once the net is part of the library.
+constexpr int NetInputCount = 24;
+} // namespace
+
+// The undefined note; see Note.h.
+extern TONVEX_API const CNote CNote_Undef(255, Enh_Natural);
+
+// The undefined chord; see Chord.h.
+extern TONVEX_API const CChord CChord_Undef(CNote(255, Enh_Natural), CChord::bc_none, NetInputCount);

@@ -155,17 +155,19 @@ public:
   /// intervals 1 to 48; true when every check passed.
   static bool AutoTest();
 
-private:
+  /// One value of a variadic int list (here and in CChord's key number lists): only
+  /// integral or enumeration types whose every value fits an int compile, so a long
+  /// or a double in a list is an error rather than a silent cut.
   template <class T>
   static constexpr int CheckedListValue(T value) {
-    // Every value of T must fit an int: wider or floating types would be cut silently.
     constexpr bool fits =
         std::is_enum_v<T> ||
         (std::is_integral_v<T> && (std::is_signed_v<T> ? sizeof(T) <= sizeof(int) : sizeof(T) < sizeof(int)));
-    static_assert(fits, "interval lists take int values");
+    static_assert(fits, "value lists take int values");
     return int{value};
   }
 
+private:
   CMySet<int> Intvls_;
   int WrapIntvl_;
 };

@@ -3,6 +3,7 @@
 #ifndef TONVEX_H
 #define TONVEX_H
 
+#include "Chord.h"
 #include "ChordAnalysisNet.h"
 #include "ChordTypes.h"
 #include "ChordnamePref.h"

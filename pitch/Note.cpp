@@ -2,20 +2,12 @@
 #include "Note.h"
 
 #include "ChordnamePref.h"
+#include "pitch/NoteNrs.h"
 
 #include <cstdlib>
 #include <ostream>
 
 namespace {
-
-constexpr long UndefinedNoteNr = 255;
-
-std::int32_t ClampNoteNr(long noteNr) {
-  if (noteNr == UndefinedNoteNr) return UndefinedNoteNr;
-  if (noteNr < 0) return 0;
-  if (noteNr > 127) return 127;
-  return static_cast<std::int32_t>(noteNr);
-}
 
 // Row of the spelling tables: every key number outside 0..11 behaves like D.
 int SpellingRow(int keyNr) { return (keyNr >= 0 && keyNr <= 11) ? keyNr : 2; }
@@ -71,9 +63,6 @@ TEnh EnhShift(int keyNr, TEnh enh) {
 }
 
 TEnh MakeSensefulEnhForKeyNr(int /*keyNr*/, TEnh enh) { return enh; }
-
-// Load-time object; see Note.h.
-extern TONVEX_API const CNote CNote_Undef(255, Enh_Natural);
 
 CNote::CNote(long noteNr, TEnh enh) : NoteNr_(ClampNoteNr(noteNr)), Enh_(enh) { CheckEnh(); }
 
@@ -164,10 +153,7 @@ int IntvlFromTo(CNote const& a, CNote const& b) { return static_cast<int>(b.Note
 int DistanceBetween(CNote const& a, CNote const& b) { return std::abs(IntvlFromTo(a, b)); }
 int KeyIntvlFromTo(CNote const& a, CNote const& b) { return b.KeyNr() - a.KeyNr(); }
 
-int AbsKeyIntvlFromTo(CNote const& a, CNote const& b) {
-  int d = KeyIntvlFromTo(a, b) % 12;
-  return d < 0 ? d + 12 : d;
-}
+int AbsKeyIntvlFromTo(CNote const& a, CNote const& b) { return PitchClass(KeyIntvlFromTo(a, b)); }
 
 int KeyDistanceBetween(CNote const& a, CNote const& b) {
   int d = std::abs(KeyIntvlFromTo(a, b));

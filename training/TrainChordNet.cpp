@@ -12,7 +12,8 @@
 //
 // Everything is deterministic: the agent seeds rand() itself, runs a fixed schedule
 // and decides only on computed figures, never on time. The same build therefore
-// writes the same file; another compiler or maths library may round differently.
+// writes the same file (g++ 12 and clang 14 on x86-64 with glibc agree bit for bit;
+// another maths library may round its exponentials differently).
 //
 // Schedule:
 //   - srand(1); the net gets random start weights, then the pinned entries.

@@ -77,16 +77,6 @@ TEST_F(ChordNetSourceTest, WeightsReadBackBitForBit) {
   EXPECT_TRUE(WeightsOfChordNetSource("no definitions here").empty());
 }
 
-TEST(ChordNetSource, ReadsTheStaticDataTextOfAnyNet) {
-  NeuronParamGuard guard;
-  TPredefinedWeights shape{{2, 1}, {1, {2, 0, 0, 0}, {INPUT_SUM, ACT_SIGM, 1.0f, 0.0f, OUTPUT_NONE, 0.0f}}, nullptr};
-  std::vector<float> weights = {0.5f, -1.25f, 123.456789f, 0.0001f, -3.0f, 7.0f};
-  shape.weights = weights.data();
-  NeuronalNet small(shape);
-  const std::vector<float> expected = {0.5f, -1.25f, 123.457f, 0.0001f, -3.0f, 7.0f};
-  EXPECT_EQ(WeightsOfChordNetSource(small.weights_to_text(2, -1.0f, -1.0f, {})), expected);
-}
-
 TEST(ChordNetSource, WeightsFitForTheTextFormats) {
   const std::vector<float> fitted =
       WeightsFitForText({1e-5f, -9e-5f, 0.0001f, -0.0f, 2e6f, -1e6f, 999998.0f, -161.907f, 0.01f});

@@ -350,23 +350,74 @@ public:
 
   // ---- Root finding ----------------------------------------------------------
 
-  /// Sets the likeliest root and its spelling from the notes, then spells the root
-  /// with the fewest accidentals and the notes after the root's scale. The root ends
-  /// as a pitch class 0..11. Not thread-safe with SCA_NEURONAL_NET (the built-in net
-  /// is shared).
+  // "Setting the root" below always means what SetRootNote does: the root becomes
+  // specified, and the intervals become stale when the chord has notes.
+
+  /// Sets the likeliest root and its spelling from the notes.
+  ///
+  /// A chord without notes becomes the undefined chord whatever the algorithm: notes
+  /// and intervals emptied (the wrap interval kept), root the undefined note,
+  /// specified, intervals fresh, lonely-lowest-note mark clear.
+  ///
+  /// By rules (SCA_RULE_WEIGHTS, and every value other than SCA_NEURONAL_NET) the
+  /// pitch classes 0..11 are scored in turn with ProbThatNoteIsRootNote, relative to
+  /// the current root; the highest score wins. On a tie with the best so far (a
+  /// score of 0 for C counts as one), with R the current root's pitch class:
+  ///   - when the cache holds the best one's interval above R but not the
+  ///     candidate's, the best one stays; when it holds the candidate's but not the
+  ///     best one's, the candidate wins;
+  ///   - when it holds both or neither, the one nearer to the lowest note's pitch
+  ///     class the shorter way round the octave wins, the earlier pitch class on
+  ///     equal distance.
+  /// The winner is set as the root: its pitch class 0..11 (the lowest octave), in
+  /// the natural spelling (C major's spelling for a black key).
+  ///
+  /// SCA_NEURONAL_NET is meant for the built-in chord analysis net; while that net is
+  /// not part of the library, the rules choose for it as well.
+  ///
+  /// Both algorithms finish with SetRootNoteEnhWithLeastSigns and then
+  /// AdjustEnhOfChordNotesToRootScale.
   void SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo);
-  /// Rule-based score of the note's pitch class as the root; larger is likelier.
+  /// Rule-based score of the candidate's pitch class c as the root; larger is
+  /// likelier, never negative. It reads the interval cache relative to the current
+  /// root (rebuilt first when stale); L is the lowest note's pitch class (that of
+  /// the undefined note 255, 3, for an empty chord). The first rule that applies:
+  ///   cache exactly {0, 6, 11} and c == L + 2      -> 33
+  ///   cache exactly {0, 4, 9, 10} and c == L       -> 45
+  ///   cache exactly {0, 2, 6, 11} and c == L + 2   -> 45
+  ///   cache exactly {0, 3, 6, 10} and c == L       -> 48
+  ///   cache exactly {0, 7}, three notes, c == L    -> 5
+  ///   otherwise the sum, over the cached intervals in ascending order, of a weight
+  ///   for the distance from c up to the pitch class of IntvlIxToNote of that
+  ///   index; the weights depend on the number of intervals (1..2, 3, 4..6, 7 and
+  ///   more, where the first three intervals count four times); 0 for an empty
+  ///   cache.
+  /// L + 2 is not taken round the octave, so with L of B flat or B the two rules
+  /// that compare with it never apply.
   int ProbThatNoteIsRootNote(CNote const& candidate) const;
-  /// Sets the interval cache's wrap interval to the built-in net's input count (24).
+  /// Sets the interval cache's wrap interval to the built-in net's input count (24)
+  /// and marks the intervals stale, so the next query rebuilds them under it.
   void SetWrapIntvlToNeuronalNetInputCount();
-  /// Interval of the lowest note above the root, 0..11.
+  /// Interval of the lowest note's pitch class above the root's, 0..11 (for an empty
+  /// chord that of the undefined note, pitch class 3).
   int LowestNoteIntvl() const;
-  /// Makes the first note at the ix-th interval the root (specified).
+  /// Sets the root to the first note, lowest first, whose pitch class interval above
+  /// the root is the ix-th cached interval (number and spelling; specified). When no
+  /// note lies there (ix out of range, or an interval above 11 inserted directly)
+  /// nothing changes, the intervals included.
   void SetRootNoteToIntvlIx(int ix);
-  /// Respells the root to the spelling whose chord has the fewest signs.
+  /// Respells the root (its note number stays) to the spelling whose chord has the
+  /// fewest key-signature signs, by SignsCount's magnitude: the root as it is
+  /// (after CheckEnh), or one enharmonic step toward the flats, or one toward the
+  /// sharps. Ties keep the root's spelling first, then prefer the flats. Sets the
+  /// root (specified, intervals stale when there are notes).
   void SetRootNoteEnhWithLeastSigns();
-  /// Spells every note after the chord's scale. Writes false through a non-null
-  /// pointer, whatever happened.
+  /// Spells every note as the chord's scale (Scale()) spells its pitch class, then
+  /// CheckEnh: so in an A minor chord a G sharp, left plain by the minor scale,
+  /// becomes C major's A flat. Two notes of one pitch in two spellings thereby
+  /// become the same note and are kept once. The root and the flags are not
+  /// touched. When `changed` is not null, false is written through it whether or
+  /// not a spelling changed: callers cannot learn from it that anything changed.
   void AdjustEnhOfChordNotesToRootScale(bool* changed);
 
   // ---- The chord in a key ----------------------------------------------------

@@ -35,14 +35,14 @@ CChord::TChordOption Maj7Option() {
 void AddOptionOfIntvl(CChordOptions& options, CIntvlSet const& intvls, int intvl, CChord::TBasicChord bc) {
   using C = CChord;
   auto has = [&intvls](int n) { return intvls.HasIntvl(n); };
-  bool otherThirds = intvls.HasOtherStackedThirdsOptionThan(intvl);
+  auto otherThirds = [&intvls, intvl] { return intvls.HasOtherStackedThirdsOptionThan(intvl); };
   // The major sixth: a diminished seventh in a diminished chord.
   auto addSixth = [&] { options.Add(9, bc == C::bc_dim ? C::co_7 : C::co_6); };
 
   switch (PitchClass(intvl)) {
-  case 1: options.Add(13, otherThirds ? C::co_b9 : C::co_add_b9); break;
+  case 1: options.Add(13, otherThirds() ? C::co_b9 : C::co_add_b9); break;
   case 2:
-    if (bc != C::bc_sus2) options.Add(14, otherThirds ? C::co_9 : C::co_add_9);
+    if (bc != C::bc_sus2) options.Add(14, otherThirds() ? C::co_9 : C::co_add_9);
     break;
   case 3:
     if (has(4))
@@ -54,7 +54,7 @@ void AddOptionOfIntvl(CChordOptions& options, CIntvlSet const& intvls, int intvl
     if (!IsOneOf(bc, {C::bc_maj, C::bc_aug})) options.Add(4, C::co_3);
     break;
   case 5:
-    if (bc != C::bc_sus4) options.Add(17, otherThirds ? C::co_11 : C::co_add_11);
+    if (bc != C::bc_sus4) options.Add(17, otherThirds() ? C::co_11 : C::co_add_11);
     break;
   case 6:
     if (bc != C::bc_dim) {

@@ -188,6 +188,23 @@ TEST(ChordName, NameReadsOnlyTheSharedPreferences) {
   EXPECT_EQ(chord.Name(own), chord.Name(DefaultChordnamePref));
 }
 
+TEST(ChordName, KeyNumbersThroughRootFindingToTheName) {
+  struct Row {
+    CMySet<int> keyNrs;
+    char const* name;
+  } const rows[] = {{{4, 7, 0}, "C  "},
+                    {{10, 0, 4, 7}, "C  7"},
+                    {{1, 5, 8}, "Db  "},
+                    {{2, 5, 9}, "D m "},
+                    {{3, 7, 10, 2}, "Eb  ma7"}};
+  for (Row const& row : rows) {
+    CChord chord;
+    chord.SetFromKeyNrSet(row.keyNrs);
+    chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_RULE_WEIGHTS);
+    EXPECT_EQ(chord.Name(DefaultChordnamePref), row.name);
+  }
+}
+
 // ---- No root -----------------------------------------------------------------------
 
 TEST(ChordName, ChordWithoutRoot) {

@@ -1,6 +1,6 @@
 // Chords: the basic chord, reshaping into a basic chord, its intervals and scale, and
 // the XG chord type.
-#include "Chord.h"
+#include "chord/ChordScale.h"
 
 #include "pitch/NoteNrs.h"
 
@@ -138,19 +138,25 @@ CIntvlSet CChord::IntvlsInBasicChord() const {
   return intvls;
 }
 
-CScale::TType CChord::ScaleType() const {
-  TBasicChord bc = BasicChord();
-  return (bc == bc_min || bc == bc_dim) ? CScale::Scale_Minor : CScale::Scale_Major;
+CScale::TType ChordScaleType(CChord::TBasicChord bc) {
+  return (bc == CChord::bc_min || bc == CChord::bc_dim) ? CScale::Scale_Minor : CScale::Scale_Major;
 }
 
-CScale CChord::Scale() const {
-  CScale scale(RootNote_, ScaleType());
-  if (Intvls_.HasIntvl(1)) {
+CScale ChordScale(CNote const& root, CChord::TBasicChord bc, CIntvlSet const& intvls) {
+  CScale scale(root, ChordScaleType(bc));
+  if (intvls.HasIntvl(1)) {
     // The minor second one step below the second degree: over C, D flat.
     int second = PitchClass(scale.RootNote().KeyNr() + 2);
     scale.SetEnhForChromStep(1, static_cast<TEnh>(scale.EnhForKeynr(second) - 1));
   }
   return scale;
+}
+
+CScale::TType CChord::ScaleType() const { return ChordScaleType(BasicChord()); }
+
+CScale CChord::Scale() const {
+  TBasicChord bc = BasicChord(); // brings the cache up to date
+  return ChordScale(RootNote_, bc, Intvls_);
 }
 
 int CChord::XGChordIx() const {

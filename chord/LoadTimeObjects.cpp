@@ -3,15 +3,11 @@
 // earlier ones.
 #include "Chord.h"
 #include "Note.h"
-
-namespace {
-// Wrap interval of the undefined chord: the built-in chord analysis net's input
-// count, whose record replaces this constant once the net is part of the library.
-constexpr int NetInputCount = 24;
-} // namespace
+#include "chord/NetInputCount.h"
 
 // The undefined note; see Note.h.
 extern TONVEX_API const CNote CNote_Undef(255, Enh_Natural);
 
-// The undefined chord; see Chord.h.
+// The undefined chord; see Chord.h. Its wrap interval is the built-in net's input
+// count.
 extern TONVEX_API const CChord CChord_Undef(CNote(255, Enh_Natural), CChord::bc_none, NetInputCount);

@@ -350,34 +350,110 @@ public:
 
   // ---- Root finding ----------------------------------------------------------
 
-  /// Sets the likeliest root and its spelling from the notes, then spells the root
-  /// with the fewest accidentals and the notes after the root's scale. The root ends
-  /// as a pitch class 0..11. Not thread-safe with SCA_NEURONAL_NET (the built-in net
-  /// is shared).
+  // "Setting the root" below always means what SetRootNote does: the root becomes
+  // specified, and the intervals become stale when the chord has notes.
+
+  /// Sets the likeliest root and its spelling from the notes.
+  ///
+  /// A chord without notes becomes the undefined chord whatever the algorithm: notes
+  /// and intervals emptied (the wrap interval kept), root the undefined note,
+  /// specified, intervals fresh, lonely-lowest-note mark clear.
+  ///
+  /// By rules (SCA_RULE_WEIGHTS, and every value other than SCA_NEURONAL_NET) the
+  /// pitch classes 0..11 are scored in turn with ProbThatNoteIsRootNote, relative to
+  /// the current root; the highest score wins. On a tie with the best so far (a
+  /// score of 0 for C counts as one), with R the current root's pitch class:
+  ///   - when the cache holds the best one's interval above R but not the
+  ///     candidate's, the best one stays; when it holds the candidate's but not the
+  ///     best one's, the candidate wins;
+  ///   - when it holds both or neither, the one nearer to the lowest note's pitch
+  ///     class the shorter way round the octave wins, the earlier pitch class on
+  ///     equal distance.
+  /// The winner is set as the root: its pitch class 0..11 (the lowest octave), in
+  /// the natural spelling (C major's spelling for a black key).
+  ///
+  /// SCA_NEURONAL_NET is meant for the built-in chord analysis net; while that net is
+  /// not part of the library, the rules choose for it as well.
+  ///
+  /// Both algorithms finish with SetRootNoteEnhWithLeastSigns and then
+  /// AdjustEnhOfChordNotesToRootScale.
   void SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo);
-  /// Rule-based score of the note's pitch class as the root; larger is likelier.
+  /// Rule-based score of the candidate's pitch class c as the root; larger is
+  /// likelier, never negative. It reads the interval cache relative to the current
+  /// root (rebuilt first when stale); L is the lowest note's pitch class (that of
+  /// the undefined note 255, 3, for an empty chord). The first rule that applies:
+  ///   cache exactly {0, 6, 11} and c == L + 2      -> 33
+  ///   cache exactly {0, 4, 9, 10} and c == L       -> 45
+  ///   cache exactly {0, 2, 6, 11} and c == L + 2   -> 45
+  ///   cache exactly {0, 3, 6, 10} and c == L       -> 48
+  ///   cache exactly {0, 7}, three notes, c == L    -> 5
+  ///   otherwise the sum, over the cached intervals in ascending order, of a weight
+  ///   for the distance from c up to the pitch class of IntvlIxToNote of that
+  ///   index; the weights depend on the number of intervals (1..2, 3, 4..6, 7 and
+  ///   more, where the first three intervals count four times); 0 for an empty
+  ///   cache.
+  /// L + 2 is not taken round the octave, so with L of B flat or B the two rules
+  /// that compare with it never apply.
   int ProbThatNoteIsRootNote(CNote const& candidate) const;
-  /// Sets the interval cache's wrap interval to the built-in net's input count (24).
+  /// Sets the interval cache's wrap interval to the built-in net's input count (24)
+  /// and marks the intervals stale, so the next query rebuilds them under it.
   void SetWrapIntvlToNeuronalNetInputCount();
-  /// Interval of the lowest note above the root, 0..11.
+  /// Interval of the lowest note's pitch class above the root's, 0..11 (for an empty
+  /// chord that of the undefined note, pitch class 3).
   int LowestNoteIntvl() const;
-  /// Makes the first note at the ix-th interval the root (specified).
+  /// Sets the root to the first note, lowest first, whose pitch class interval above
+  /// the root is the ix-th cached interval (number and spelling; specified). When no
+  /// note lies there (ix out of range, or an interval above 11 inserted directly)
+  /// nothing changes, the intervals included.
   void SetRootNoteToIntvlIx(int ix);
-  /// Respells the root to the spelling whose chord has the fewest signs.
+  /// Respells the root (its note number stays) to the spelling whose chord has the
+  /// fewest key-signature signs, by SignsCount's magnitude: the root as it is
+  /// (after CheckEnh), or one enharmonic step toward the flats, or one toward the
+  /// sharps. Ties keep the root's spelling first, then prefer the flats. Sets the
+  /// root (specified, intervals stale when there are notes).
   void SetRootNoteEnhWithLeastSigns();
-  /// Spells every note after the chord's scale. Writes false through a non-null
-  /// pointer, whatever happened.
+  /// Spells every note as the chord's scale (Scale()) spells its pitch class, then
+  /// CheckEnh: so in an A minor chord a G sharp, left plain by the minor scale,
+  /// becomes C major's A flat. Two notes of one pitch in two spellings thereby
+  /// become the same note and are kept once. The root and the flags are not
+  /// touched. When `changed` is not null, false is written through it whether or
+  /// not a spelling changed: callers cannot learn from it that anything changed.
   void AdjustEnhOfChordNotesToRootScale(bool* changed);
 
   // ---- The chord in a key ----------------------------------------------------
 
-  /// Harmonic function code 0..15 of the chord in the key (0 = undefined).
+  // A key number belongs to the key when it is the key number of one of the key's
+  // degrees (CScale::DegreeNrToKeyNr). Key numbers are note number % 12 with the
+  // truncating remainder, so a note or root with a negative note number is on no
+  // degree and counts as outside every key.
+
+  /// Harmonic function code 0..15: by the degree of the root's key number and the
+  /// basic chord (0 = undefined, also for a root on no degree):
+  ///   degree I    major 1 (I), minor 2 (Im)
+  ///   degree II   major 3 (II), minor 4 (IIm), diminished 5 (IIdim)
+  ///   degree III  major 6 (III), minor 7 (IIIm)
+  ///   degree IV   major 8 (IV), minor 9 (IVm)
+  ///   degree V    major, sus4 and sus2 10 (V), minor 11 (Vm)
+  ///   degree VI   major 12 (VI), minor 13 (VIm)
+  ///   degree VII  diminished 15 (VIIdim)
+  /// Code 14 (bVII) has a name but no chord gets it.
   int HarmFuncIn(CSignKey const& key) const;
-  /// 0..2 from the closeness tables; for basic chord none, CountIntvlsInSignKey.
+  /// How close the chord lies to the key, 0..2, from a table per basic chord and key
+  /// mode indexed by the root's distance above the key's root. The tables are kept
+  /// as they have always been, surprising values included (in a major key a major
+  /// chord on the major third scores 2, diminished and augmented chords score 2
+  /// everywhere). For basic chord none the result is CountIntvlsInSignKey instead.
   int ClosenessToSignKey(CSignKey const& key) const;
+  /// How many of the cached intervals lie in the key, each interval counted once by
+  /// the note it stands for (IntvlIxToNote). An interval cached above the octave
+  /// (direct inserts under a specified root) matches no note's pitch class interval
+  /// and so stands for the lowest note.
   int CountIntvlsInSignKey(CSignKey const& key) const;
+  /// The interval count minus CountIntvlsInSignKey.
   int CountIntvlsNotInSignKey(CSignKey const& key) const;
+  /// How many stored notes lie outside the key; octave doublings count each time.
   int CountNotesNotInSignKey(CSignKey const& key) const;
+  /// Whether every interval lies in the key; true for a chord without intervals.
   bool IsInSignKey(CSignKey const& key) const;
   /// Signs of the key the root and basic chord imply (positive sharps, negative
   /// flats). May respell a root whose spelling is not senseful.
@@ -385,33 +461,75 @@ public:
 
   // ---- Options and names -----------------------------------------------------
 
-  /// Option rank -> option; ascending rank is the print order.
+  /// Option rank -> option; ascending rank is the print order. Each cached interval
+  /// i, visited in ascending order, gives at most one option by the row of its pitch
+  /// class ("has n": n is in the cache exactly; "others": the cache holds an
+  /// interval other than 0, 3, 4, 7 and i as cached):
+  ///   1   rank 13: "b9" with others, else "add b9"
+  ///   2   rank 14 (not in sus2): "9" with others, else "add 9"
+  ///   3   has 4: rank 15 "#9"; else, unless minor or diminished, rank 3 "b3"
+  ///   4   unless major or augmented: rank 4 "3"
+  ///   5   rank 17 (not in sus4): "11" with others, else "add 11"
+  ///   6   not in diminished: has 7 or 8: rank 18 "#11", else rank 99 "b5"
+  ///   7   in diminished, augmented and none only: rank 7 "5"
+  ///   8   not in augmented: has 7: rank 20 "b13", else rank 99 "#5"
+  ///   9   has 10 or 11 without 8: rank 21 "13"; else rank 9 "6" ("7" in diminished)
+  ///   10  in diminished first rank 99 "b5"; then rank 10 "7"
+  ///   11  rank 11: "j7" (Maj7ShownAs 1), "maj7" (2), else "ma7"
+  /// A rank already filled keeps its option: of "b5" and "#5", which share rank 99,
+  /// the first found stays. In a chord wider than an octave (highest - lowest note
+  /// number > 12) whose lowest note is marked lonely (see UpdateIntvlSet), the
+  /// lowest note's interval gives no option while
+  /// CChordnamePref::OmitOptionOfLonelyLowestNoteInWideChord is on.
   std::map<int, TChordOption> OptionsMap(CChordnamePref& pref) const;
+  /// The option texts in rank order, also for an undefined root.
   std::vector<std::string> OptionsStringVector(CChordnamePref& pref) const;
-  /// Options joined with "/" (or "(...)" with ChordOptionSep 1); "" for an
-  /// undefined root.
+  /// Options joined with "/" ("7/9"), or with ChordOptionSep 1 the later ones in
+  /// parentheses ("7(9)"); "" for an undefined root.
   std::string OptionsName(CChordnamePref& pref) const;
   /// True for sus4 and sus2, whose text stands after the options ("C 7 sus 4").
   bool BasicChordNameAfterOptionsName() const;
-  /// The block after the root name: separators are kept even around empty parts,
-  /// so a major triad's block is two blanks ("C  ") and a minor triad's "m" plus a
-  /// blank ("C m ").
+  /// The block after the root name: a separator, the basic chord text, a separator,
+  /// the options (options first for sus4 and sus2). The separator is " ", or ","
+  /// with SeparateBlocksInNames, and is kept even around empty parts, so a major
+  /// triad's block is two blanks ("C  ") and a minor triad's "m" plus a blank
+  /// ("C m "). Names are never trimmed.
   std::string BasicChordAndOptionsName(CChordnamePref& pref) const;
   /// "No Chord" for an undefined root; else the root name and, for more than one
-  /// note, the block.
+  /// note, the block. With MinorSmall a minor chord's root begins with a small
+  /// letter and still has its "m" ("c m 7").
   std::string NameWithoutSlash(CChordnamePref& pref) const;
-  /// NameWithoutSlash plus " / " and the bass when the bass is not the root (the
-  /// stored bass is respelled by the chord's scale).
+  /// NameWithoutSlash plus " / " (",/ " with SeparateBlocksInNames) and the bass
+  /// when the bass's key number differs from the root's ("C   / E", also
+  /// "No Chord / C"). The bass is spelled by the chord's scale, and so is the stored
+  /// lowest note, which keeps that spelling (the one exception: where the notes
+  /// hold the same pitch in a second spelling that the new one would reach or pass
+  /// in the notes' order, the stored note keeps its spelling). A chord without notes
+  /// shows the undefined note as its bass ("C / Undefined").
   std::string NameWithSlash(CChordnamePref& pref) const;
-  /// The name to show: narrow chords without slash (NarrowChordsWithoutSlash), wide
-  /// chords with it. Names under the shared preferences of DefaultChordnamePref.
+  /// The name to show: with NarrowChordsWithoutSlash (the default) a chord spanning
+  /// at most an octave is named without slash, however inverted; otherwise
+  /// NameWithSlash. Names under DefaultChordnamePref whatever object is passed
+  /// (all preferences are shared statics anyway). The preferences PreferSlashChord,
+  /// PreferSlashChordIfMoreNotesThan, ShowInversion, InversionAsName and
+  /// NoDoubleSigns change no name.
   std::string Name(CChordnamePref& pref) const;
-  /// The name the chord would have with the given root (as given, after CheckEnh).
+  /// Name() of a copy with the given root. The root is checked with CheckEnh (the
+  /// given note receives the checked spelling) and then named as spelled: the
+  /// fewest-signs choice between it and its enharmonic neighbours counts the signs
+  /// of this chord, not of the chord with the new root, so it always keeps the
+  /// given spelling (C sharp stays C sharp although D flat has fewer signs). Like
+  /// SignsCount, it respells this chord's root when that is not senseful.
   std::string NameWithLeastSignsForThisRootNote(CNote const& root, CChordnamePref& pref) const;
-  /// The name with the given root; a root spelling that is not senseful is replaced
-  /// by the C major spelling (also in the given note).
+  /// Name() of a copy with the given root; a root spelling that is not senseful is
+  /// replaced by the C major spelling (C#, Eb, F#, Ab, Bb, naturals), in the given
+  /// note too.
   std::string NameForThisRootNote(CNote const& root, CChordnamePref& pref) const;
-  /// Harmonic function name: "IIm", "V", ... or, with HarmFuncNaming 1, "Sp", "D".
+  /// Harmonic function name of HarmFuncIn(key): Roman ("IIm", "V", "VIIdim") or,
+  /// with HarmFuncNaming 1, functional letters ("Sp", "D"), some by the key's mode
+  /// ("III" is "TG" in a major key, "P" in a minor one). Code 0 is "undef". The
+  /// texts are kept as they have always been printed, unfinished-looking ones
+  /// included ("IIdim##", "VIIdim##in ks_min").
   std::string HarmFuncName(CSignKey key, CChordnamePref& pref) const;
 
   // ---- Diagnostics -----------------------------------------------------------

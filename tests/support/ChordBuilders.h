@@ -5,6 +5,7 @@
 #include "Chord.h"
 
 #include <set>
+#include <string>
 #include <vector>
 
 namespace chordtest {
@@ -30,6 +31,30 @@ inline CChord RootedChord(long root, std::vector<long> const& noteNrs) {
   chord.SetRootNote(Nat(root));
   for (long n : noteNrs) chord.AddNote(Nat(n));
   return chord;
+}
+
+/// The notes first, then the root specified: the cache is rebuilt from the notes,
+/// folded into one octave, with its lonely-lowest-note mark, as when a host names a
+/// voicing.
+inline CChord NotesThenRoot(CNote const& root, std::vector<long> const& noteNrs) {
+  CChord chord = ChordOf(noteNrs);
+  chord.SetRootNote(root);
+  return chord;
+}
+
+/// Notes 60 + i for each interval, then root C.
+inline CChord OverC(std::vector<int> const& intvls) {
+  std::vector<long> noteNrs(intvls.begin(), intvls.end());
+  for (long& n : noteNrs) n += 60;
+  return NotesThenRoot(Nat(60), noteNrs);
+}
+
+/// "prefix v1 v2 ..." for failure messages.
+template <class T>
+std::string ListLabel(char const* prefix, std::vector<T> const& values) {
+  std::string label = prefix;
+  for (T v : values) label += " " + std::to_string(v);
+  return label;
 }
 
 inline std::vector<long> NoteNrs(CChord const& chord) {

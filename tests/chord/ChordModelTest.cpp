@@ -334,4 +334,18 @@ TEST(ChordModel, UseAllMemberFunctionsLeavesTheChordAsItWas) {
   EXPECT_FALSE(chord.LowestNoteLonely());
 }
 
+// Naming a wide chord respells its stored bass (G flat under C major becomes F sharp);
+// the diagnostic caller works on a copy and leaves it alone.
+TEST(ChordModel, UseAllNonDestructiveMemberFunctionsKeepsSpellings) {
+  CChord chord(24);
+  chord.AddNote(CNote(54, Enh_Flat));
+  for (long n : {60L, 64L, 67L}) chord.AddNote(Nat(n));
+  chord.SetRootNote(Nat(60));
+  ASSERT_EQ(chord.LowestNote().Enh(), Enh_Flat);
+  chord.UseAllNonDestructiveMemberFunctions();
+  EXPECT_EQ(chord.LowestNote().Enh(), Enh_Flat);
+  chord.Name(DefaultChordnamePref);
+  EXPECT_EQ(chord.LowestNote().Enh(), Enh_Sharp);
+}
+
 } // namespace

@@ -8,11 +8,13 @@
 
 #include <string>
 
+int RunChordCommand(CommandLine const& line);
 int RunNoteCommand(CommandLine const& line);
 int RunScaleCommand(CommandLine const& line);
 int RunKeyCommand(CommandLine const& line);
 
 /// The help texts (standard output for --help, standard error after a usage error).
+std::string ChordUsage(); // the program's help: the chord command and the list of commands
 std::string NoteUsage();
 std::string ScaleUsage();
 std::string KeyUsage();

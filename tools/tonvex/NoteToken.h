@@ -26,7 +26,7 @@ enum TTokenKind : int { Kind_NoteName, Kind_Note, Kind_KeyNumber };
 TTokenProblem ReadNoteName(std::string_view token, CNote& note);
 
 /// Reads a note name (as ReadNoteName) or a note number 0..127, which is spelled as
-/// C major spells its key (C#, Eb, F#, G#, Bb).
+/// C major spells its key (C#, Eb, F#, Ab, Bb).
 TTokenProblem ReadNote(std::string_view token, CNote& note);
 
 /// Reads a key number 0..11 (C = 0).

@@ -2,6 +2,7 @@
 // spelled degrees and key signatures.
 #include "Commands.h"
 #include "NoteToken.h"
+#include "SignsText.h"
 
 #include "ChordnamePref.h"
 #include "Scale.h"
@@ -26,18 +27,6 @@ bool ReadScaleType(std::string const& token, CScale::TType& type) {
   if (value < 0 || value >= TypeCount) return false;
   type = static_cast<CScale::TType>(value);
   return true;
-}
-
-// "+2 (2 sharps)", "-1 (1 flat)", "0 (none)".
-std::string SignsText(int signs) {
-  char text[48];
-  int count = signs < 0 ? -signs : signs;
-  if (signs == 0)
-    std::snprintf(text, sizeof text, "0 (none)");
-  else
-    std::snprintf(text, sizeof text, "%+d (%d %s%s)", signs, count, signs > 0 ? "sharp" : "flat",
-                  count == 1 ? "" : "s");
-  return text;
 }
 
 std::string DegreeNames(CScale const& scale) {

@@ -7,19 +7,6 @@
 
 namespace {
 
-const char* const Usage = "usage: tonvex COMMAND [OPTIONS] [ARGS...]\n"
-                          "\n"
-                          "Commands:\n"
-                          "  note NAME...     read note names and show their numbers, spellings and names\n"
-                          "  scale ROOT TYPE  show a scale's spelled degrees and key signature\n"
-                          "  key ROOT [minor] show a key's name, key signature and degrees\n"
-                          "\n"
-                          "Options:\n"
-                          "  --help           show this text\n"
-                          "  --version        show the library version\n"
-                          "\n"
-                          "Run 'tonvex COMMAND --help' for the options of a command.\n";
-
 void PrintVersion() {
   // The version string starts with the four-character "@(#)" marker.
   const char* text = reinterpret_cast<const char*>(TonvexVersionString) + 4;
@@ -33,7 +20,7 @@ std::string UsageOf(TCommand command) {
   case Cmd_Key: return KeyUsage();
   case Cmd_Chord: break;
   }
-  return Usage;
+  return ChordUsage();
 }
 
 } // namespace
@@ -63,9 +50,5 @@ int main(int argc, char** argv) {
   case Cmd_Key: return RunKeyCommand(line);
   case Cmd_Chord: break;
   }
-  if (line.Operands.empty()) {
-    std::fputs(Usage, stderr);
-    return 2;
-  }
-  return UsageError(Cmd_Chord, "unknown command '" + line.Operands[0] + "'");
+  return RunChordCommand(line);
 }

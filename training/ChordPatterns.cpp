@@ -1,8 +1,8 @@
 // Chord voicings, their labels and their encoding for the chord analysis net.
 #include "training/ChordPatterns.h"
 
+#include "Chord.h"
 #include "ChordTypes.h"
-#include "NoteNames.h"
 
 #include <algorithm>
 #include <map>
@@ -165,11 +165,11 @@ bool IsUnambiguous(std::vector<TChordPatternType> const& types, TPitchClassMask 
   return std::all_of(found.begin(), found.end(), [&](Interpretation const& i) { return i.root == found.front().root; });
 }
 
-std::string ChordVoicingName(int rootKeyNr, std::string const& typeName, int bassKeyNr, std::string const& layout) {
-  std::string name = KeyNrAndEnhToName(rootKeyNr, Enh_Natural, DefaultChordnamePref) + " " + typeName;
-  if (Mod12(bassKeyNr) != Mod12(rootKeyNr))
-    name += " / " + KeyNrAndEnhToName(bassKeyNr, Enh_Natural, DefaultChordnamePref);
-  return name + " (" + layout + ")";
+std::string ChordVoicingName(std::vector<int> const& noteNrs, int rootKeyNr, std::string const& layout) {
+  CChord chord;
+  chord.SetFromNoteNrSet(CMySet<int>(noteNrs.begin(), noteNrs.end()));
+  chord.SetRootNote(CNote(Mod12(rootKeyNr), Enh_Natural));
+  return chord.Name(DefaultChordnamePref) + " (" + layout + ")";
 }
 
 std::vector<TChordVoicing> ChordVoicings() {
@@ -192,8 +192,9 @@ std::vector<TChordVoicing> ChordVoicings() {
             known =
                 labels.emplace(relative, std::make_pair(LabelledRoot(types, relative), IsUnambiguous(types, relative)))
                     .first;
-          voicings.push_back({std::move(notes), root, ChordVoicingName(root, type.name, bassKeyNr, layout.name),
-                              known->second.first, known->second.second});
+          const int label = known->second.first;
+          std::string name = ChordVoicingName(notes, notes.front() + label, layout.name);
+          voicings.push_back({std::move(notes), root, std::move(name), label, known->second.second});
         }
       }
   return voicings;

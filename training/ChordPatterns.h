@@ -74,7 +74,7 @@ struct TChordPatternType {
 struct TChordVoicing {
   std::vector<int> noteNrs; ///< ascending, the lowest is the bass
   int rootKeyNr;            ///< the root the voicing was built on
-  std::string name;         ///< "C major 7 / E (close)"
+  std::string name;         ///< ChordVoicingName of its notes and labelled root
   int label;                ///< labelled root as interval 0..11 above the bass
   bool unambiguous;         ///< all interpretations of its pitch classes agree on the root
 };
@@ -107,9 +107,15 @@ int LabelledRoot(std::vector<TChordPatternType> const& types, TPitchClassMask re
 /// none).
 bool IsUnambiguous(std::vector<TChordPatternType> const& types, TPitchClassMask relative);
 
-/// The pattern name of a voicing: "C major 7 / E (close)", without " / E" in root
-/// position.
-std::string ChordVoicingName(int rootKeyNr, std::string const& typeName, int bassKeyNr, std::string const& layout);
+/// The pattern name of a voicing: the library's own name (CChord::Name under the
+/// current naming preferences, DefaultChordnamePref) of a chord of these note numbers
+/// whose root is set to rootKeyNr's pitch class in the natural spelling, followed by
+/// the layout in parentheses. The name is kept as the library writes it, blanks
+/// included: "C  7 (close)", and with the default preferences a slash bass only for a
+/// chord wider than an octave ("C   / E (spread)"). The layout in the name tells
+/// close, open, spread and doubled voicings of a chord apart; inversions that stay
+/// within an octave still share a name, as the library names them alike.
+std::string ChordVoicingName(std::vector<int> const& noteNrs, int rootKeyNr, std::string const& layout);
 
 /// All voicings: types in priority order, then roots 0..11, inversions, layouts.
 std::vector<TChordVoicing> ChordVoicings();

@@ -101,33 +101,78 @@ TEST(ChordVoicings, EveryTypeRootInversionAndLayout) {
         }
 }
 
+// The voicing of a type over a root, an inversion and a layout, found by its place in
+// the generator's order.
+TChordVoicing const& VoicingOf(std::vector<TChordVoicing> const& voicings, std::string const& typeName, int root,
+                               std::size_t inversion, std::size_t layout) {
+  std::size_t at = 0;
+  for (TChordPatternType const& type : ChordPatternTypes()) {
+    if (type.name == typeName)
+      return voicings.at(at + (static_cast<std::size_t>(root) * type.intvls.size() + inversion) * 4 + layout);
+    at += 12 * 4 * type.intvls.size();
+  }
+  ADD_FAILURE() << "no type " << typeName;
+  return voicings.front();
+}
+
 TEST(ChordVoicings, LayoutsAndNames) {
+  enum { Close, Open, Spread, Doubled };
+  // Names as the library names the notes under the labelled root: the root, the
+  // basic chord and option block with its blanks, a slash bass only when the chord
+  // spans more than an octave; then the layout.
   struct Case {
-    char const* name;
+    char const* type;
+    int root;
+    std::size_t inversion;
+    std::size_t layout;
     std::vector<int> notes;
+    char const* name;
   };
   const Case cases[] = {
-      {"C major (close)", {36, 40, 43}},
-      {"C major (open)", {36, 40, 55}},
-      {"C major (spread)", {36, 52, 55}},
-      {"C major (doubled)", {24, 36, 40, 43, 48}},
-      {"C major / E (close)", {40, 43, 48}},
-      {"C major / G (spread)", {43, 60, 64}},
-      {"Eb minor 7 / F# (close)", {42, 46, 49, 51}},
-      {"C major 6 added 9 / E (close)", {40, 43, 45, 50, 60}},
-      {"F# major j7 #11 (close)", {42, 46, 49, 53, 60}},
-      {"A single note (doubled)", {33, 45, 57}},
-      {"Bb fifth / F (spread)", {41, 58}},
+      {"major", 0, 0, Close, {36, 40, 43}, "C   (close)"},
+      {"major", 0, 0, Open, {36, 40, 55}, "C   (open)"},
+      {"major", 0, 0, Spread, {36, 52, 55}, "C   (spread)"},
+      {"major", 0, 0, Doubled, {24, 36, 40, 43, 48}, "C   (doubled)"},
+      {"major", 0, 1, Close, {40, 43, 48}, "C   (close)"},
+      {"major", 0, 2, Spread, {43, 60, 64}, "C   / G (spread)"},
+      // Eb minor 7 over G flat is F# A# C# D#, labelled F# major 6 from its bass.
+      {"minor 7", 3, 1, Close, {42, 46, 49, 51}, "F#  6 (close)"},
+      {"major 6 added 9", 0, 1, Close, {40, 43, 45, 50, 60}, "C  6/9 / E (close)"},
+      {"major j7 #11", 6, 0, Close, {42, 46, 49, 53, 60}, "F#  ma7/#11 (close)"},
+      // E Gb Bb C, built as C major 7 b5 over E, labelled from the nearer root F#.
+      {"major 7 b5", 0, 1, Close, {40, 42, 46, 48}, "F#  7/b5 (close)"},
+      {"single note", 9, 0, Doubled, {33, 45, 57}, "A no 3  (doubled)"},
+      {"fifth", 10, 1, Spread, {41, 58}, "Bb 5  / F (spread)"},
+      {"minor 7", 9, 0, Close, {45, 48, 52, 55}, "A m 7 (close)"},
   };
   const std::vector<TChordVoicing> voicings = ChordVoicings();
   for (Case const& c : cases) {
-    const auto found =
-        std::find_if(voicings.begin(), voicings.end(), [&](TChordVoicing const& v) { return v.name == c.name; });
-    ASSERT_NE(found, voicings.end()) << c.name;
-    EXPECT_EQ(found->noteNrs, c.notes) << c.name;
+    TChordVoicing const& v = VoicingOf(voicings, c.type, c.root, c.inversion, c.layout);
+    EXPECT_EQ(v.noteNrs, c.notes) << c.name;
+    EXPECT_EQ(v.name, c.name);
   }
-  EXPECT_EQ(ChordVoicingName(1, "minor", 4, "open"), "C# minor / E (open)");
-  EXPECT_EQ(ChordVoicingName(8, "major 7", 8, "spread"), "G# major 7 (spread)");
+  EXPECT_EQ(ChordVoicingName({61, 64, 68}, 1, "open"), "C# m  (open)");
+  // The root is taken as a pitch class; a bass on the root gets no slash however wide.
+  EXPECT_EQ(ChordVoicingName({44, 60, 63, 66}, 20, "spread"), "Ab  7 (spread)");
+}
+
+// What every name shows, read from the notes and the label alone: the labelled
+// root (C major's spelling of black keys), a slash bass exactly when the chord spans
+// more than an octave over a bass other than the root, and the layout.
+TEST(ChordVoicings, EveryNameShowsItsRootBassAndLayout) {
+  const char* const roots[12] = {"C", "C#", "D", "Eb", "E", "F", "F#", "G", "Ab", "A", "Bb", "B"};
+  const char* const layouts[4] = {"close", "open", "spread", "doubled"};
+  const std::vector<TChordVoicing> voicings = ChordVoicings();
+  for (std::size_t i = 0; i < voicings.size(); ++i) {
+    TChordVoicing const& v = voicings[i];
+    const std::string root = roots[Mod12(v.noteNrs.front() + v.label)];
+    EXPECT_EQ(v.name.rfind(root + " ", 0), 0u) << v.name;
+    const std::string layout = std::string(" (") + layouts[i % 4] + ")";
+    ASSERT_GT(v.name.size(), layout.size());
+    EXPECT_EQ(v.name.substr(v.name.size() - layout.size()), layout) << v.name;
+    const bool slash = v.noteNrs.back() - v.noteNrs.front() > 12 && v.label != 0;
+    EXPECT_EQ(v.name.find(" / ") != std::string::npos, slash) << v.name;
+  }
 }
 
 TEST(ChordNetInputs, IntervalsAboveTheLowestNoteFoldedIntoOneOctave) {
@@ -232,7 +277,7 @@ TEST(ChordTrainingPatterns, OneHotTargetsWithoutContradictions) {
     count += c.voicingCount;
   }
   EXPECT_EQ(count, static_cast<int>(voicings.size()));
-  EXPECT_EQ(classes.front().pattern.name, "C major (close)");
+  EXPECT_EQ(classes.front().pattern.name, "C   (close)");
   EXPECT_EQ(classes.front().voicingCount, 12 * 4);
 }
 

@@ -25,6 +25,7 @@ void CChord::UpdateIntvlSet() const {
   // A key number lies in -11..11 (note number % 12), so a difference of two lies in
   // -22..22 and its folded interval in 0..22: a mask collects the intervals, which
   // then go into the cache in ascending order.
+  constexpr int MaxFolded = 22;
   std::uint32_t folded = 0;
   if (!Notes_.empty()) {
     int rootKeyNr = RootNote_.KeyNr();
@@ -39,10 +40,14 @@ void CChord::UpdateIntvlSet() const {
       first = false;
     }
   }
-  int intvls[32];
+  // Every candidate is written and only the members are counted: no branch on the
+  // bits, which differ from chord to chord.
+  int intvls[MaxFolded + 1];
   std::size_t count = 0;
-  for (int intvl = 0; folded != 0; ++intvl, folded >>= 1)
-    if (folded & 1u) intvls[count++] = intvl;
+  for (int intvl = 0; intvl <= MaxFolded; ++intvl) {
+    intvls[count] = intvl;
+    count += folded >> intvl & 1u;
+  }
   Intvls_.SetIntvlsFromList(intvls, count);
   IntvlsStale_ = 0;
 }

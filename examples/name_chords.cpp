@@ -10,7 +10,8 @@ int main() {
   for (const char* text : {"C3", "F#4", "Bb2", "H2"}) {
     CNote note;
     if (!note.SetFromString(text, pref)) continue;
-    std::cout << text << ": note " << note.NoteNr() << ", " << note.KeyName(pref) << note.OctName(pref) << '\n';
+    std::cout << text << ": note " << note.NoteNr() << ", " << note.KeyName(pref)
+              << note.OctName(pref) << '\n';
   }
 
   // A key and its spelled degrees; German names are one preference away.
@@ -18,7 +19,8 @@ int main() {
   for (int german = 0; german <= 1; ++german) {
     CChordnamePref::AccidentalsAsLetters = german;
     std::cout << "key " << key.Name(pref) << ":";
-    for (int degree = 0; degree < 7; ++degree) std::cout << ' ' << key.Scale().DegreeNrToKey(degree).KeyName(pref);
+    for (int degree = 0; degree < 7; ++degree)
+      std::cout << ' ' << key.Scale().DegreeNrToKey(degree).KeyName(pref);
     std::cout << '\n';
   }
   CChordnamePref::AccidentalsAsLetters = 0;
@@ -28,7 +30,8 @@ int main() {
   CChord chord;
   chord.SetFromNoteNrSet({76, 79, 84}); // E4 G4 C5
   chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_NEURONAL_NET);
-  std::cout << "E4 G4 C5: \"" << chord.Name(pref) << "\", root " << chord.RootNote().KeyName(pref) << '\n';
+  std::cout << "E4 G4 C5: \"" << chord.Name(pref) << "\", root "
+            << chord.RootNote().KeyName(pref) << '\n';
 
   // Its harmonic function in G major, as a Roman numeral and as a function letter.
   CSignKey const gMajor(CNote(7, Enh_Natural), CSignKey::SignKey_Major);
@@ -41,5 +44,6 @@ int main() {
   chord.SetFromNoteNrSet({69, 72, 76, 79}); // A3 C4 E4 G4
   for (long root : {0, 9})
     std::cout << "A3 C4 E4 G4 over " << CNote(root, Enh_Natural).KeyName(pref) << ": \""
-              << chord.NameWithLeastSignsForThisRootNote(CNote(root, Enh_Natural), pref) << "\"\n";
+              << chord.NameWithLeastSignsForThisRootNote(CNote(root, Enh_Natural), pref)
+              << "\"\n";
 }

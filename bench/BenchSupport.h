@@ -3,8 +3,8 @@
 #ifndef TONVEX_BENCH_BENCHSUPPORT_H
 #define TONVEX_BENCH_BENCHSUPPORT_H
 
-#include "AllocationCounter.h"
 #include "Chord.h"
+#include "support/AllocationCounter.h"
 
 #include <benchmark/benchmark.h>
 

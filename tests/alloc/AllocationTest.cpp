@@ -1,44 +1,18 @@
 // What a host does for every chord allocates nothing on the heap, but the name it
-// gets back when the name is too long for the string's inline buffer. The library
-// is a shared object and allocates through the operator new replaced here.
+// gets back when the name is too long for the string's inline buffer. Allocations
+// are counted by the operator new of support/AllocationCounter.cpp.
 #include "Chord.h"
 #include "ChordAnalysisNet.h"
 #include "NeuronalNet.h"
+#include "support/AllocationCounter.h"
 
 #include <gtest/gtest.h>
 
 #include <cstdint>
-#include <cstdlib>
-#include <new>
 #include <string>
 #include <vector>
 
 namespace {
-std::uint64_t Allocations = 0;
-
-void* Allocate(std::size_t size) {
-  ++Allocations;
-  if (void* p = std::malloc(size == 0 ? 1 : size)) return p;
-  throw std::bad_alloc();
-}
-} // namespace
-
-void* operator new(std::size_t size) { return Allocate(size); }
-void* operator new[](std::size_t size) { return Allocate(size); }
-void operator delete(void* p) noexcept { std::free(p); }
-void operator delete[](void* p) noexcept { std::free(p); }
-void operator delete(void* p, std::size_t) noexcept { std::free(p); }
-void operator delete[](void* p, std::size_t) noexcept { std::free(p); }
-
-namespace {
-
-// Allocations made by f.
-template <class F>
-std::uint64_t AllocationsOf(F f) {
-  std::uint64_t const before = Allocations;
-  f();
-  return Allocations - before;
-}
 
 // Chords of 1 to 8 notes: every pitch class set of up to 8 classes over each bass
 // pitch class it holds, close above the bass and spread over two octaves with the

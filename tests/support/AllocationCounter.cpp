@@ -1,10 +1,10 @@
-#include "AllocationCounter.h"
+#include "support/AllocationCounter.h"
 
 #include <cstdlib>
 #include <new>
 
 namespace {
-// The benchmarks run on one thread; a plain counter does not disturb the timing.
+// The programs count on one thread; a plain counter does not disturb a timing.
 std::uint64_t Allocations = 0;
 
 void* Allocate(std::size_t size) {

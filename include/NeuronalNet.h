@@ -66,10 +66,12 @@ public:
   void setInput(std::vector<float> const& inputs);
   /// Evaluates the net on the current input array. Allocation-free; the hidden
   /// layers ping-pong between layer buffers 0 and 1 however many there are. Every
-  /// layer is evaluated as Neuron::calcVec evaluates it, to the bit; on calcVec's
-  /// fast path the neurons of a layer are summed side by side from a transposed
-  /// copy of the weights, which the first use after a weight change (building,
-  /// copying, acquire_weights, training, loading) brings up to date.
+  /// layer is evaluated as Neuron::calcVec evaluates it, to the bit (a NaN output
+  /// stays NaN; where two NaNs meet, which payload survives is the compiler's
+  /// choice in either way); on calcVec's fast path the neurons of a layer are
+  /// summed side by side from a transposed copy of the weights, which the first
+  /// use after a weight change (copying, acquire_weights, training, loading)
+  /// brings up to date.
   void use();
   /// setInput, then use().
   void use(std::vector<float> inputs);

@@ -20,6 +20,20 @@ TDynNetProp DynProp(int hiddenLayerCount, int const* hiddenSizes, INPUT_TYPE inp
   return dyn;
 }
 
+// The layers of a net in evaluation order, each with the input count of its
+// neurons, which is the count use() evaluates it with. Returns their number.
+int NetLayers(TFixedNetProp const& fixed, TDynNetProp const& dyn, std::vector<Neuron*> (&hidden)[4],
+              std::vector<Neuron*>& output, CNetLayer (&layers)[5]) {
+  int count = 0;
+  int n = fixed.input_count;
+  for (int k = 0; k < dyn.hidden_layer_count; ++k) {
+    layers[count++] = {hidden[k].data(), dyn.hidden_layer_sizes[k], n};
+    n = dyn.hidden_layer_sizes[k];
+  }
+  layers[count++] = {output.data(), fixed.output_count, dyn.hidden_layer_count > 0 ? n : 0};
+  return count;
+}
+
 bool SameNeuronProp(TNeuronProp const& a, TNeuronProp const& b) {
   return a.input_type == b.input_type && a.activation_type == b.activation_type &&
          a.activation_slope == b.activation_slope && a.activation_threshold == b.activation_threshold &&
@@ -100,7 +114,10 @@ void NeuronalNet::BuildNet(TFixedNetProp fixed, TDynNetProp dyn) {
 
   const int buffers = std::max(LayerCount() + 1, 2);
   for (int b = 0; b < 5; ++b) layer_buffers_[b].assign(b < buffers ? Count(longest) : 0, 0.0f);
-  WeightsChanged();
+  // The transposed weights take their room here, so that use() never allocates.
+  CNetLayer layers[5];
+  PackLayers(layers, NetLayers(fixed_, dyn_, hidden_layers_, output_layer_, layers), packed_weights_);
+  packed_stale_ = 0;
 }
 
 void NeuronalNet::setInput(std::vector<float> const& inputs) {
@@ -110,15 +127,8 @@ void NeuronalNet::setInput(std::vector<float> const& inputs) {
 
 void NeuronalNet::use() {
   std::copy(input_values_.begin(), input_values_.end(), layer_buffers_[0].begin());
-  // The layers in order, each with the input count of its neurons.
   CNetLayer layers[5];
-  int layerCount = 0;
-  int n = fixed_.input_count;
-  for (int k = 0; k < LayerCount(); ++k) {
-    layers[layerCount++] = {hidden_layers_[k].data(), HiddenSize(k), n};
-    n = HiddenSize(k);
-  }
-  layers[layerCount++] = {output_layer_.data(), fixed_.output_count, OutputInputCount()};
+  const int layerCount = NetLayers(fixed_, dyn_, hidden_layers_, output_layer_, layers);
 
   // The parameters are read as they stand now: another net may have changed them.
   const bool fastPath = Neuron::combined_type == 0;

@@ -14,9 +14,9 @@
 
 namespace {
 
-// Chords of 1 to 8 notes: every pitch class set of up to 8 classes over each bass
-// pitch class it holds, close above the bass and spread over two octaves with the
-// bass doubled.
+// Chords of 1 to 8 notes: every pitch class set of up to 8 classes over the bass
+// pitch classes 0, 5 and 10 where it holds them, close above the bass, and (up to
+// 7 classes) spread over two octaves above the bass doubled an octave lower.
 std::vector<CMySet<int>> Voicings() {
   std::vector<CMySet<int>> voicings;
   for (unsigned mask = 1; mask < 4096; ++mask) {

@@ -1,6 +1,7 @@
 // Chords: the interval cache, its queries and the key number queries.
 #include "Chord.h"
 
+#include "chord/IntvlFold.h"
 #include "pitch/NoteNrs.h"
 
 #include <algorithm>
@@ -20,8 +21,12 @@ constexpr int KeyNrListEnd = -1;
 } // namespace
 
 void CChord::UpdateIntvlSet() const {
-  Intvls_.Clear();
   LowestNoteLonely_ = 1;
+  // A key number lies in -11..11 (note number % 12), so a difference of two lies in
+  // -22..22 and its folded interval in 0..22: a mask collects the intervals, which
+  // then go into the cache in ascending order.
+  constexpr int MaxFolded = 22;
+  std::uint32_t folded = 0;
   if (!Notes_.empty()) {
     int rootKeyNr = RootNote_.KeyNr();
     int lowest = PitchClassIntvl(*Notes_.begin(), RootNote_);
@@ -30,11 +35,20 @@ void CChord::UpdateIntvlSet() const {
       // raw stays signed on purpose: a repeat of the lowest pitch class that lies
       // below the root's pitch class number never clears the mark.
       int raw = note.KeyNr() - rootKeyNr;
-      Intvls_.InsertIntvl(raw);
+      folded |= std::uint32_t{1} << FoldedIntvl(raw, Intvls_.WrapIntvl());
       if (!first && raw == lowest) LowestNoteLonely_ = 0;
       first = false;
     }
   }
+  // Every candidate is written and only the members are counted: no branch on the
+  // bits, which differ from chord to chord.
+  int intvls[MaxFolded + 1];
+  std::size_t count = 0;
+  for (int intvl = 0; intvl <= MaxFolded; ++intvl) {
+    intvls[count] = intvl;
+    count += folded >> intvl & 1u;
+  }
+  Intvls_.SetIntvlsFromList(intvls, count);
   IntvlsStale_ = 0;
 }
 

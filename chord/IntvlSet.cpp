@@ -1,6 +1,8 @@
 // Interval sets: insertion rule, list operations, queries, inversion, comparison.
 #include "IntvlSet.h"
 
+#include "chord/IntvlFold.h"
+
 #include <algorithm>
 #include <cstdint>
 #include <ostream>
@@ -15,20 +17,6 @@ constexpr std::uint32_t MaxListedIntvl = 127;
 constexpr std::size_t MaxFilledCount = 127;
 
 bool EndsFillList(int value) { return static_cast<std::uint32_t>(value) > MaxListedIntvl; }
-
-// The insertion rule: raise a negative value by whole octaves to the smallest value
-// 0 or above, then fold it by the wrap interval (0 = no folding; a negative wrap
-// interval folds like its magnitude, as the truncating remainder does).
-int FoldedIntvl(int value, int wrapIntvl) {
-  if (value < 0) {
-    value %= 12;
-    if (value < 0) value += 12;
-  }
-  if (wrapIntvl == 0) return value;
-  // value >= 0 here, so the remainder is defined under every wrap interval (-1 and
-  // INT_MIN included) and is not negative.
-  return value % wrapIntvl;
-}
 
 // The part of a set's members, in order, that a value list names: bit p marks the
 // member at position p. Sets of up to 64 members are marked in one word; larger

@@ -74,13 +74,6 @@ CNote LikeliestRootByNet(CChord& chord) {
   return CNote(PitchClass(PitchClass(lowest.NoteNr()) + winner), Enh_Natural);
 }
 
-// What every algorithm does once it has set the root: the root's spelling with the
-// fewest signs, then the notes spelled after it.
-void SpellRootAndNotes(CChord& chord) {
-  chord.SetRootNoteEnhWithLeastSigns();
-  chord.AdjustEnhOfChordNotesToRootScale(nullptr);
-}
-
 } // namespace
 
 void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo) {
@@ -89,7 +82,14 @@ void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisA
     return;
   }
   SetRootNote(algo == SCA_NEURONAL_NET ? LikeliestRootByNet(*this) : LikeliestRootByRules(*this));
-  SpellRootAndNotes(*this);
+  // Both algorithms finish alike: the root's spelling with the fewest signs, then
+  // the notes spelled after it. Setting the root marked the intervals stale, so the
+  // spelling's sign counts rebuilt them for the root's note number, which the
+  // respelled root keeps: the rebuild that spelling the notes would ask for next
+  // gives that same cache and lonely-lowest-note mark, and is left out.
+  SetRootNoteEnhWithLeastSigns();
+  IntvlsStale_ = 0;
+  AdjustEnhOfChordNotesToRootScale(nullptr);
 }
 
 void CChord::SetRootNoteEnhWithLeastSigns() {

@@ -65,7 +65,13 @@ public:
   /// ignored and a shorter vector leaves the remaining inputs as they were.
   void setInput(std::vector<float> const& inputs);
   /// Evaluates the net on the current input array. Allocation-free; the hidden
-  /// layers ping-pong between layer buffers 0 and 1 however many there are.
+  /// layers ping-pong between layer buffers 0 and 1 however many there are. Every
+  /// layer is evaluated as Neuron::calcVec evaluates it, to the bit (a NaN output
+  /// stays NaN; where two NaNs meet, which payload survives is the compiler's
+  /// choice in either way); on calcVec's fast path the neurons of a layer are
+  /// summed side by side from a transposed copy of the weights, which the first
+  /// use after a weight change (copying, acquire_weights, training, loading)
+  /// brings up to date.
   void use();
   /// setInput, then use().
   void use(std::vector<float> inputs);
@@ -158,6 +164,9 @@ private:
   int LayerCount() const { return dyn_.hidden_layer_count; }
   int HiddenSize(int k) const { return dyn_.hidden_layer_sizes[k]; }
   int OutputInputCount() const { return LayerCount() > 0 ? HiddenSize(LayerCount() - 1) : 0; }
+  // Marks the transposed weights of the forward pass out of date; every change of
+  // a weight calls it.
+  void WeightsChanged() { packed_stale_ = 1; }
 
   // Field order as in the exchange description; ownership by value members.
   std::vector<float> input_values_;
@@ -170,6 +179,8 @@ private:
   TFixedNetProp fixed_{};
   TDynNetProp dyn_{};
   std::vector<std::unique_ptr<Neuron>> neurons_; ///< owns every neuron, in the flat order
+  std::vector<float> packed_weights_;            ///< each layer transposed (nnet/PackedLayers.h), in layer order
+  int packed_stale_ = 1;                         ///< packed_weights_ lag behind the neurons' weights
 };
 
 #endif

@@ -294,6 +294,7 @@ void NeuronalNet::load_weights_from_file(char const* path) {
     std::printf("weight %i, %f\n", static_cast<int>(values.size()), static_cast<double>(values.back()));
   }
   CopyWeightsFrom(neurons_, values.data(), values.size());
+  WeightsChanged();
 }
 
 TNetProp NeuronalNet::load_net_properties_from_file(char const* path) {

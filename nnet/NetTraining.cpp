@@ -86,6 +86,7 @@ float NeuronalNet::train(training_pattern pattern) {
         return predecessors[static_cast<std::size_t>(i)]->output;
       });
   }
+  WeightsChanged();
   first_training_step_ = 0;
   previous_changes_ = std::move(changes);
 

@@ -1,5 +1,6 @@
 // Neuron evaluation: input, activation and output functions and the derivative.
 #include "Neuron.h"
+#include "nnet/FastPath.h"
 
 #include <algorithm>
 #include <cmath>
@@ -22,12 +23,6 @@ namespace {
 constexpr double FlatSpot = static_cast<double>(0.1f);
 
 std::size_t Count(int n) { return static_cast<std::size_t>(std::max(n, 0)); }
-
-float ClampToUnit(float a) {
-  if (a > 1.0f) return 1.0f;
-  if (a < -1.0f) return -1.0f;
-  return a; // NaN passes
-}
 
 float NetInput(float const* x, float const* w, int n, int weightCount) {
   const int terms = std::min(n, weightCount); // weights past the array count as 0
@@ -128,13 +123,10 @@ void Neuron::calcVec(Neuron** neurons, float const* inputs, int n, float* output
   const float s = activation_slope;
   for (int j = 0; j < count; ++j) {
     Neuron& neuron = *neurons[j];
-    const float z = DotProduct(inputs, neuron.weights.get(), std::min(n, neuron.input_count));
-    neuron.net_input = z;
-    const float e = std::exp((t - z) * s);
-    neuron.cached_exp = e;
-    const float a = ClampToUnit(1.0f / (e + 1.0f));
-    neuron.output = a;
-    outputs[j] = a;
+    neuron.net_input = DotProduct(inputs, neuron.weights.get(), std::min(n, neuron.input_count));
+    neuron.cached_exp = FastPathExp(FastPathArgument(neuron.net_input, t, s));
+    neuron.output = FastPathOutput(neuron.cached_exp);
+    outputs[j] = neuron.output;
   }
 }
 

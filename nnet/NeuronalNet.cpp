@@ -1,6 +1,7 @@
 // Net structure, forward pass, flat weights, copying and the trace.
 #include "NeuronalNet.h"
 #include "nnet/FlatWeights.h"
+#include "nnet/PackedLayers.h"
 
 #include <algorithm>
 #include <iostream>
@@ -17,6 +18,20 @@ TDynNetProp DynProp(int hiddenLayerCount, int const* hiddenSizes, INPUT_TYPE inp
   for (int k = 0; k < std::min(hiddenLayerCount, 4); ++k) dyn.hidden_layer_sizes[k] = hiddenSizes[k];
   dyn.neuron_prop = {inputType, activationType, slope, threshold, outputType, outputThreshold};
   return dyn;
+}
+
+// The layers of a net in evaluation order, each with the input count of its
+// neurons, which is the count use() evaluates it with. Returns their number.
+int NetLayers(TFixedNetProp const& fixed, TDynNetProp const& dyn, std::vector<Neuron*> (&hidden)[4],
+              std::vector<Neuron*>& output, CNetLayer (&layers)[5]) {
+  int count = 0;
+  int n = fixed.input_count;
+  for (int k = 0; k < dyn.hidden_layer_count; ++k) {
+    layers[count++] = {hidden[k].data(), dyn.hidden_layer_sizes[k], n};
+    n = dyn.hidden_layer_sizes[k];
+  }
+  layers[count++] = {output.data(), fixed.output_count, dyn.hidden_layer_count > 0 ? n : 0};
+  return count;
 }
 
 bool SameNeuronProp(TNeuronProp const& a, TNeuronProp const& b) {
@@ -48,6 +63,7 @@ NeuronalNet::NeuronalNet(int inputCount, int hiddenLayerCount, int* hiddenSizes,
 NeuronalNet::NeuronalNet(NeuronalNet const& other) : previous_changes_(other.previous_changes_) {
   BuildNet(other.fixed_, other.dyn_);
   CopyNeuronWeights(other.neurons_, neurons_);
+  WeightsChanged();
   first_training_step_ = other.first_training_step_;
   momentum_amount_ = other.momentum_amount_;
 }
@@ -55,6 +71,7 @@ NeuronalNet::NeuronalNet(NeuronalNet const& other) : previous_changes_(other.pre
 NeuronalNet NeuronalNet::operator=(NeuronalNet other) {
   BuildNet(other.fixed_, other.dyn_);
   CopyNeuronWeights(other.neurons_, neurons_);
+  WeightsChanged();
   previous_changes_ = std::move(other.previous_changes_);
   first_training_step_ = other.first_training_step_;
   momentum_amount_ = other.momentum_amount_;
@@ -97,6 +114,10 @@ void NeuronalNet::BuildNet(TFixedNetProp fixed, TDynNetProp dyn) {
 
   const int buffers = std::max(LayerCount() + 1, 2);
   for (int b = 0; b < 5; ++b) layer_buffers_[b].assign(b < buffers ? Count(longest) : 0, 0.0f);
+  // The transposed weights take their room here, so that use() never allocates.
+  CNetLayer layers[5];
+  PackLayers(layers, NetLayers(fixed_, dyn_, hidden_layers_, output_layer_, layers), packed_weights_);
+  packed_stale_ = 0;
 }
 
 void NeuronalNet::setInput(std::vector<float> const& inputs) {
@@ -106,15 +127,28 @@ void NeuronalNet::setInput(std::vector<float> const& inputs) {
 
 void NeuronalNet::use() {
   std::copy(input_values_.begin(), input_values_.end(), layer_buffers_[0].begin());
+  CNetLayer layers[5];
+  const int layerCount = NetLayers(fixed_, dyn_, hidden_layers_, output_layer_, layers);
+
+  // The parameters are read as they stand now: another net may have changed them.
+  const bool fastPath = Neuron::combined_type == 0;
+  if (fastPath && packed_stale_) {
+    PackLayers(layers, layerCount, packed_weights_);
+    packed_stale_ = 0;
+  }
   float* source = layer_buffers_[0].data();
   float* target = layer_buffers_[1].data();
-  int n = fixed_.input_count;
-  for (int k = 0; k < LayerCount(); ++k) {
-    Neuron::calcVec(hidden_layers_[k].data(), source, n, target, HiddenSize(k));
+  float const* weights = packed_weights_.data();
+  for (int k = 0; k < layerCount; ++k) {
+    CNetLayer const& layer = layers[k];
+    if (fastPath) {
+      ForwardPackedLayer(layer, weights, source, target);
+      weights += PackedWeightCount(layer.Count, layer.Inputs);
+    } else {
+      Neuron::calcVec(layer.Neurons, source, layer.Inputs, target, layer.Count);
+    }
     std::swap(source, target);
-    n = HiddenSize(k);
   }
-  Neuron::calcVec(output_layer_.data(), source, OutputInputCount(), target, fixed_.output_count);
 }
 
 void NeuronalNet::use(std::vector<float> inputs) {
@@ -157,6 +191,7 @@ bool NeuronalNet::acquire_weights(TPredefinedWeights net) {
   const std::size_t count = FlatWeightCount(neurons_);
   if (net.weights == nullptr && count > 0) return false;
   CopyWeightsFrom(neurons_, net.weights, count);
+  WeightsChanged();
   return true;
 }
 

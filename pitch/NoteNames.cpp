@@ -1,7 +1,7 @@
 // Note names in English, German and solmisation style, and octave names.
 #include "NoteNames.h"
 
-#include <cstdio>
+#include <string>
 
 namespace {
 
@@ -167,7 +167,5 @@ std::string CNote::OctName(CChordnamePref const& /*pref*/) const {
   if (NoteNr_ == 255) return std::string();
   int q = NoteNr_ / 12;
   int oct = CChordnamePref::NoteNr_60_is == 0 ? q - 2 : (CChordnamePref::NoteNr_60_is == 2 ? q : q - 1);
-  char text[16];
-  std::snprintf(text, sizeof text, "%d", oct);
-  return text;
+  return std::to_string(oct);
 }

@@ -295,6 +295,33 @@ TEST(RootFinding, ChordWithoutNotesBecomesUndefinedUnderEveryAlgorithm) {
 
 // ---- Root operations ---------------------------------------------------------------
 
+// Whatever the chord held before, root finding leaves the interval cache and the
+// lonely-lowest-note mark of its notes above the root it found, fresh, exactly as a
+// chord given those notes and that root builds them; a direct insert afterwards
+// lands in that cache in both.
+TEST(RootFinding, LeavesTheCacheOfItsRoot) {
+  for (unsigned mask = 1; mask < 4096; mask += 7)
+    for (TSingleChordAnalysisAlgo algo : {SCA_RULE_WEIGHTS, SCA_NEURONAL_NET}) {
+      // Notes added under a root given first: the cache holds their unfolded
+      // differences (a ninth as 14) until something rebuilds it.
+      std::vector<long> noteNrs{36 + static_cast<long>(mask % 12)};
+      for (int pc = 0; pc < 12; ++pc)
+        if (mask >> pc & 1u) noteNrs.push_back(48 + pc + 12 * (pc % 2));
+      CChord chord = RootedChord(40, noteNrs);
+      chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(algo);
+
+      CChord fresh(24);
+      fresh.SetFromNoteSet(chord.Notes());
+      fresh.SetRootNote(chord.RootNote());
+      SCOPED_TRACE("mask " + std::to_string(mask) + " algo " + std::to_string(algo));
+      ASSERT_EQ(Members(chord.IntvlSet()), Members(fresh.IntvlSet()));
+      EXPECT_EQ(chord.LowestNoteLonely(), fresh.LowestNoteLonely());
+      chord.AddIntvlInCompingRange(14);
+      fresh.AddIntvlInCompingRange(14);
+      EXPECT_EQ(Members(chord.IntvlSet()), Members(fresh.IntvlSet()));
+    }
+}
+
 TEST(RootOperations, SetRootNoteToIntvlIxTakesTheFirstNoteAtThatInterval) {
   CChord chord = ChordOf({64, 67, 72, 84}); // root E: {0, 3, 8}
   chord.SetRootNoteToIntvlIx(2);

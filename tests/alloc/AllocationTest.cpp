@@ -1,0 +1,111 @@
+// What a host does for every chord allocates nothing on the heap, but the name it
+// gets back when the name is too long for the string's inline buffer. Allocations
+// are counted by the operator new of support/AllocationCounter.cpp.
+#include "Chord.h"
+#include "ChordAnalysisNet.h"
+#include "NeuronalNet.h"
+#include "support/AllocationCounter.h"
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace {
+
+// Chords of 1 to 8 notes: every pitch class set of up to 8 classes over the bass
+// pitch classes 0, 5 and 10 where it holds them, close above the bass, and (up to
+// 7 classes) spread over two octaves above the bass doubled an octave lower.
+std::vector<CMySet<int>> Voicings() {
+  std::vector<CMySet<int>> voicings;
+  for (unsigned mask = 1; mask < 4096; ++mask) {
+    int classes = 0;
+    for (unsigned m = mask; m != 0; m &= m - 1) ++classes;
+    if (classes > 8) continue;
+    for (int bass = 0; bass < 12; bass += 5) {
+      if (!(mask >> bass & 1u)) continue;
+      CMySet<int> close, spread{36 + bass};
+      int step = 0;
+      for (int pc = 0; pc < 12; ++pc) {
+        if (!(mask >> pc & 1u)) continue;
+        int const above = (pc - bass + 12) % 12;
+        close.insert(48 + bass + above);
+        if (classes < 8) spread.insert(48 + bass + above + 12 * (step++ % 2));
+      }
+      voicings.push_back(close);
+      if (classes < 8) voicings.push_back(spread);
+    }
+  }
+  return voicings;
+}
+
+// The name's own allocation, where it does not fit the string's inline buffer.
+std::uint64_t NameAllocations(std::string const& name) { return name.size() > std::string().capacity() ? 1 : 0; }
+
+TEST(Allocation, HostPathAllocatesOnlyLongNames) {
+  std::vector<CMySet<int>> const voicings = Voicings();
+  CChord reused(24);
+  // The first use of root finding sizes the built-in net's input buffer.
+  reused.SetFromNoteNrSet(voicings.front());
+  reused.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_NEURONAL_NET);
+  int longNames = 0;
+  for (CMySet<int> const& voicing : voicings) {
+    for (TSingleChordAnalysisAlgo algo : {SCA_NEURONAL_NET, SCA_RULE_WEIGHTS}) {
+      std::string name;
+      std::uint64_t const reusedCount = AllocationsOf([&] {
+        reused.SetFromNoteNrSet(voicing);
+        reused.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(algo);
+        name = reused.Name(DefaultChordnamePref);
+      });
+      ASSERT_EQ(reusedCount, NameAllocations(name)) << name;
+      longNames += static_cast<int>(NameAllocations(name));
+
+      // A host that makes its note set and chord afresh for every chord.
+      std::uint64_t const freshCount = AllocationsOf([&] {
+        CMySet<int> sounding;
+        for (auto n = voicing.rbegin(); n != voicing.rend(); ++n) sounding.insert(*n);
+        CChord chord(24);
+        chord.SetFromNoteNrSet(sounding);
+        chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(algo);
+        name = chord.Name(DefaultChordnamePref);
+      });
+      ASSERT_EQ(freshCount, NameAllocations(name)) << name;
+    }
+  }
+  // Long names exist, so the allowance above was used and checked.
+  EXPECT_GT(longNames, 0);
+}
+
+TEST(Allocation, SetsGoToTheHeapOnlyBeyondTheirInlineValues) {
+  for (int size = 0; size <= 40; ++size) {
+    std::uint64_t const count = AllocationsOf([size] {
+      CMySet<int> set;
+      for (int v = size; v > 0; --v) set.insert(v);
+      CMySet<int> copy = set;
+      copy.clear();
+      for (int v = 0; v < size; ++v) copy.insert(v);
+    });
+    // Beyond the inline values each set grows twice as large at a time: 32, 64.
+    std::uint64_t const perSet = size <= 16 ? 0 : (size <= 32 ? 1 : 2);
+    EXPECT_EQ(count, 2 * perSet) << size;
+  }
+}
+
+TEST(Allocation, ForwardPassAllocatesNothing) {
+  NeuronalNet net(ChordAnalysisNeuronalNet);
+  std::vector<float> inputs(24, 0.0f);
+  inputs[0] = inputs[4] = inputs[7] = 1.0f;
+  EXPECT_EQ(AllocationsOf([&] {
+              net.setInput(inputs);
+              net.use();
+            }),
+            0u);
+  // New weights are packed again into the same storage.
+  TPredefinedWeights weights = net.get_weights();
+  ASSERT_TRUE(net.acquire_weights(weights));
+  EXPECT_EQ(AllocationsOf([&] { net.use(); }), 0u);
+  delete[] weights.weights;
+}
+
+} // namespace

@@ -2,11 +2,13 @@
 // notes after it, and the small root operations around them.
 #include "Chord.h"
 
-#include "chord/NetInputCount.h"
+#include "chord/NetForSingleChordAnalysis.h"
 #include "pitch/KeySignCount.h"
 #include "pitch/NoteNrs.h"
 
+#include <cstddef>
 #include <cstdlib>
+#include <vector>
 
 namespace {
 
@@ -46,6 +48,32 @@ CNote LikeliestRootByRules(CChord const& chord) {
   return bestRoot;
 }
 
+// The built-in net's input vector, kept between calls so that root finding allocates
+// nothing once the first call has sized it. Shared as the net itself is.
+std::vector<float>& NetInputs() {
+  static std::vector<float> inputs;
+  return inputs;
+}
+
+// The root the built-in net chooses: the chord's root is set to its lowest note, the
+// intervals above it (0..11) become the net's inputs, and the winning output w is
+// the root's interval above the lowest note. The root is that pitch class in the
+// lowest octave, in the natural spelling (C major's spelling for a black key).
+CNote LikeliestRootByNet(CChord& chord) {
+  CNote const lowest = chord.LowestNote();
+  chord.SetRootNote(lowest);
+  // Nets store their counts made valid, never negative.
+  auto const inputCount = static_cast<std::size_t>(NetForSingleChordAnalysis.get_input_neuron_count());
+  std::vector<float>& inputs = NetInputs();
+  inputs.assign(inputCount, 0.0f);
+  for (int intvl : chord.IntvlSet())
+    if (intvl >= 0 && static_cast<std::size_t>(intvl) < inputCount) inputs[static_cast<std::size_t>(intvl)] = 1.0f;
+  NetForSingleChordAnalysis.setInput(inputs);
+  NetForSingleChordAnalysis.use();
+  int const winner = NetForSingleChordAnalysis.winner();
+  return CNote(PitchClass(PitchClass(lowest.NoteNr()) + winner), Enh_Natural);
+}
+
 // What every algorithm does once it has set the root: the root's spelling with the
 // fewest signs, then the notes spelled after it.
 void SpellRootAndNotes(CChord& chord) {
@@ -55,14 +83,12 @@ void SpellRootAndNotes(CChord& chord) {
 
 } // namespace
 
-void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo /*algo*/) {
+void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo) {
   if (Notes_.empty()) {
     SetUndefined();
     return;
   }
-  // The built-in net is not part of the library yet; until it is, SCA_NEURONAL_NET
-  // takes the rules as every other value does.
-  SetRootNote(LikeliestRootByRules(*this));
+  SetRootNote(algo == SCA_NEURONAL_NET ? LikeliestRootByNet(*this) : LikeliestRootByRules(*this));
   SpellRootAndNotes(*this);
 }
 
@@ -128,6 +154,6 @@ void CChord::SetRootNoteToIntvlIx(int ix) {
 void CChord::SetWrapIntvlToNeuronalNetInputCount() {
   // Folding the cached intervals by the new wrap interval adds each x % 24 to the
   // cache as it stands; the next query rebuilds it from the notes in any case.
-  Intvls_.SetWrapIntvl(NetInputCount);
+  Intvls_.SetWrapIntvl(NetForSingleChordAnalysis.get_input_neuron_count());
   IntvlsStale_ = 1;
 }

@@ -372,8 +372,24 @@ public:
   /// The winner is set as the root: its pitch class 0..11 (the lowest octave), in
   /// the natural spelling (C major's spelling for a black key).
   ///
-  /// SCA_NEURONAL_NET is meant for the built-in chord analysis net; while that net is
-  /// not part of the library, the rules choose for it as well.
+  /// By the built-in chord analysis net (SCA_NEURONAL_NET; see ChordAnalysisNet.h)
+  /// the root is first set to the lowest note (number and spelling), so that the
+  /// interval cache holds the intervals above it; input i of the net is 1.0 when the
+  /// cache holds i, else 0.0 (inputs 12..23 stay 0.0, the cache being folded into
+  /// 0..11). The winning output w (the largest, the lowest index on ties) names the
+  /// root: the pitch class w semitones above the lowest note's, in the lowest octave
+  /// and the natural spelling. So E4 G4 C5 gives the inputs {0, 3, 8}, the winner 8
+  /// and the root C. The current root plays no part.
+  ///
+  /// The net is one process-wide object that keeps its last inputs and outputs, so
+  /// root finding by net must not run on two threads at once; asking it allocates
+  /// nothing after the first call (its input vector is kept). It evaluates with the process-wide Neuron parameters
+  /// (Neuron.h) as they stand: loading the library sets them to the built-in net's,
+  /// and building any other NeuronalNet afterwards replaces them, which changes the
+  /// net's answers. The library does not restore them. A host that builds nets of
+  /// its own in the same process should build one from ChordAnalysisNeuronalNet
+  /// last (or call Neuron::SetCalcParams with its properties) before it finds roots
+  /// by net again.
   ///
   /// Both algorithms finish with SetRootNoteEnhWithLeastSigns and then
   /// AdjustEnhOfChordNotesToRootScale.
@@ -395,8 +411,9 @@ public:
   /// L + 2 is not taken round the octave, so with L of B flat or B the two rules
   /// that compare with it never apply.
   int ProbThatNoteIsRootNote(CNote const& candidate) const;
-  /// Sets the interval cache's wrap interval to the built-in net's input count (24)
-  /// and marks the intervals stale, so the next query rebuilds them under it.
+  /// Sets the interval cache's wrap interval to the built-in net's input count (24,
+  /// read from the net) and marks the intervals stale, so the next query rebuilds
+  /// them under it.
   void SetWrapIntvlToNeuronalNetInputCount();
   /// Interval of the lowest note's pitch class above the root's, 0..11 (for an empty
   /// chord that of the undefined note, pitch class 3).

@@ -4,6 +4,7 @@
 #define TONVEX_H
 
 #include "Chord.h"
+#include "ChordAnalysisNet.h"
 #include "ChordTypes.h"
 #include "ChordnamePref.h"
 #include "IntvlSet.h"

@@ -67,51 +67,55 @@ scaleoracle::SpellingTable ChordNoteSpellings(int pc, int e, int bc, bool minorS
 
 // ---- After root finding --------------------------------------------------------------
 
-// Root finding on every pitch class set, as key numbers and as a voicing over a bass
-// two octaves down: the found root (pitch class k, first spelled as C major spells
-// k) takes the spelling with the fewest signs, and every note the spelling of the
-// scale on it.
+// Root finding by both algorithms on every pitch class set, as key numbers and as a
+// voicing over a bass two octaves down: the found root (pitch class k in the lowest
+// octave, first spelled as C major spells k) takes the spelling with the fewest
+// signs, and every note the spelling of the scale on it.
 TEST(RootSpelling, EveryPitchClassSetAfterRootFinding) {
-  bool rootSeen[12][2] = {};
-  int respelledRoots = 0;
-  bool agreed = true;
-  for (unsigned mask = 1; mask < 4096 && agreed; ++mask) {
-    CMySet<int> keyNrs, voicing;
+  for (TSingleChordAnalysisAlgo algo : {SCA_RULE_WEIGHTS, SCA_NEURONAL_NET}) {
+    SCOPED_TRACE(algo == SCA_NEURONAL_NET ? "by net" : "by rules");
+    bool rootSeen[12][2] = {};
+    int respelledRoots = 0;
+    bool agreed = true;
+    for (unsigned mask = 1; mask < 4096 && agreed; ++mask) {
+      CMySet<int> keyNrs, voicing;
+      for (int pc = 0; pc < 12; ++pc) {
+        if (!(mask & (1u << pc))) continue;
+        keyNrs.insert(pc);
+        voicing.insert(60 + pc);
+      }
+      voicing.insert(36 + *keyNrs.rbegin());
+      for (bool voiced : {false, true}) {
+        CChord chord(24);
+        if (voiced)
+          chord.SetFromNoteNrSet(voicing);
+        else
+          chord.SetFromKeyNrSet(keyNrs);
+        chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(algo);
+        SCOPED_TRACE("set " + std::to_string(mask) + (voiced ? " voiced" : ""));
+
+        long const k = chord.RootNote().NoteNr();
+        ASSERT_TRUE(k >= 0 && k < 12);
+        int const pc = static_cast<int>(k);
+        int const bc = chord.BasicChord();
+        int const spelling = FewestSignsSpelling(pc, DefaultSpelling(pc), bc);
+        EXPECT_EQ(chord.RootNote().Enh(), spelling);
+        respelledRoots += spelling != DefaultSpelling(pc);
+        rootSeen[pc][bc == 2 || bc == 4] = true;
+
+        scaleoracle::SpellingTable const expected =
+            ChordNoteSpellings(pc, spelling, bc, keyNrs.count(Mod12(pc + 1)) > 0);
+        for (CNote const& note : chord.Notes())
+          EXPECT_EQ(note.Enh(), expected.e[note.KeyNr()]) << "note " << note.NoteNr();
+        agreed = !HasFailure();
+      }
+    }
     for (int pc = 0; pc < 12; ++pc) {
-      if (!(mask & (1u << pc))) continue;
-      keyNrs.insert(pc);
-      voicing.insert(60 + pc);
+      EXPECT_TRUE(rootSeen[pc][0]) << "major-type root " << pc;
+      EXPECT_TRUE(rootSeen[pc][1]) << "minor-type root " << pc;
     }
-    voicing.insert(36 + *keyNrs.rbegin());
-    for (bool voiced : {false, true}) {
-      CChord chord(24);
-      if (voiced)
-        chord.SetFromNoteNrSet(voicing);
-      else
-        chord.SetFromKeyNrSet(keyNrs);
-      chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_RULE_WEIGHTS);
-      SCOPED_TRACE("set " + std::to_string(mask) + (voiced ? " voiced" : ""));
-
-      long const k = chord.RootNote().NoteNr();
-      ASSERT_TRUE(k >= 0 && k < 12);
-      int const pc = static_cast<int>(k);
-      int const bc = chord.BasicChord();
-      int const spelling = FewestSignsSpelling(pc, DefaultSpelling(pc), bc);
-      EXPECT_EQ(chord.RootNote().Enh(), spelling);
-      respelledRoots += spelling != DefaultSpelling(pc);
-      rootSeen[pc][bc == 2 || bc == 4] = true;
-
-      scaleoracle::SpellingTable const expected = ChordNoteSpellings(pc, spelling, bc, keyNrs.count(Mod12(pc + 1)) > 0);
-      for (CNote const& note : chord.Notes())
-        EXPECT_EQ(note.Enh(), expected.e[note.KeyNr()]) << "note " << note.NoteNr();
-      agreed = !HasFailure();
-    }
+    EXPECT_GT(respelledRoots, 0);
   }
-  for (int pc = 0; pc < 12; ++pc) {
-    EXPECT_TRUE(rootSeen[pc][0]) << "major-type root " << pc;
-    EXPECT_TRUE(rootSeen[pc][1]) << "minor-type root " << pc;
-  }
-  EXPECT_GT(respelledRoots, 0);
 }
 
 // ---- Fewest signs --------------------------------------------------------------------

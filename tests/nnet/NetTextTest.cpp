@@ -247,19 +247,7 @@ TEST_F(NetTextTest, PropertyReaderOnAWrittenList) {
                      "Type of Output Function erkannt!\n"
                      "0\n"
                      "Output Threshold erkannt!\n");
-  EXPECT_EQ(p.fixed.input_count, 24);
-  EXPECT_EQ(p.fixed.output_count, 12);
-  EXPECT_EQ(p.dyn.hidden_layer_count, 2);
-  EXPECT_EQ(p.dyn.hidden_layer_sizes[0], 15);
-  EXPECT_EQ(p.dyn.hidden_layer_sizes[1], 15);
-  EXPECT_EQ(p.dyn.hidden_layer_sizes[2], 0);
-  EXPECT_EQ(p.dyn.hidden_layer_sizes[3], 0);
-  EXPECT_EQ(p.dyn.neuron_prop.input_type, INPUT_SUM);
-  EXPECT_EQ(p.dyn.neuron_prop.activation_type, ACT_SIGM);
-  EXPECT_EQ(p.dyn.neuron_prop.activation_slope, 0.2f);
-  EXPECT_EQ(p.dyn.neuron_prop.activation_threshold, 2.0f);
-  EXPECT_EQ(p.dyn.neuron_prop.output_type, OUTPUT_NONE);
-  EXPECT_EQ(p.dyn.neuron_prop.output_threshold, 0.0f);
+  nettest::ExpectChordNetProperties(p.fixed, p.dyn);
 
   // The 765 weights come back to six significant digits (and one more value is read).
   NeuronalNet fresh(p.fixed, p.dyn);

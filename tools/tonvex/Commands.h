@@ -1,15 +1,25 @@
-// Subcommands of the tonvex program. Each returns the process exit status:
-// 0 success, 1 a failure while running, 2 a usage error or unreadable input.
+// Commands of the tonvex program. Each returns the process exit status: 0 success,
+// 1 some input could not be read or the output could not be written, 2 a usage
+// error (an unknown option, a missing or unreadable argument).
 #ifndef TONVEX_TOOLS_COMMANDS_H
 #define TONVEX_TOOLS_COMMANDS_H
 
+#include "CommandLine.h"
+
 #include <string>
-#include <vector>
 
-using Args = std::vector<std::string>;
+int RunChordCommand(CommandLine const& line);
+int RunNoteCommand(CommandLine const& line);
+int RunScaleCommand(CommandLine const& line);
+int RunKeyCommand(CommandLine const& line);
 
-int RunNoteCommand(Args const& args);
-int RunScaleCommand(Args const& args);
-int RunKeyCommand(Args const& args);
+/// The help texts (standard output for --help, standard error after a usage error).
+std::string ChordUsage(); // the program's help: the chord command and the list of commands
+std::string NoteUsage();
+std::string ScaleUsage();
+std::string KeyUsage();
+
+/// Prints "tonvex[ COMMAND]: <text>" on standard error; returns 2.
+int UsageError(TCommand command, std::string const& text);
 
 #endif

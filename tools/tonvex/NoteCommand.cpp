@@ -6,14 +6,9 @@
 #include "NoteNames.h"
 
 #include <cstdio>
+#include <vector>
 
 namespace {
-
-const char* const NoteUsage = "usage: tonvex note NAME...\n"
-                              "\n"
-                              "Reads each note name (a letter A..H, an optional accidental bb, b, x or #, and an\n"
-                              "optional octave number; note 60 is C3) and prints its note number, its spelling\n"
-                              "and its name in English, German and solfege style.\n";
 
 const char* SpellingWord(TEnh enh) {
   switch (enh) {
@@ -38,22 +33,28 @@ std::string NameInStyle(CNote const& note, int roman, int german) {
 
 } // namespace
 
-int RunNoteCommand(Args const& args) {
+std::string NoteUsage() {
+  return std::string("usage: tonvex note [OPTIONS] NAME...\n"
+                     "\n"
+                     "Reads each note name (a letter A..H, an optional accidental bb, b, x or #, and an\n"
+                     "optional octave number; note 60 is C3) and prints its note number, its spelling\n"
+                     "and its name in English, German and solfege style.\n"
+                     "\n"
+                     "Options:\n") +
+         NoteNameOptionsHelp + OctaveOptionHelp;
+}
+
+int RunNoteCommand(CommandLine const& line) {
+  Args const& args = line.Operands;
   if (args.empty()) {
-    std::fputs(NoteUsage, stderr);
+    std::fputs(NoteUsage().c_str(), stderr);
     return 2;
   }
   std::vector<CNote> notes;
   for (std::string const& token : args) {
-    if (token == "--help" || token == "-h") {
-      std::fputs(NoteUsage, stdout);
-      return 0;
-    }
     CNote note;
-    if (!ReadNoteName(token, note)) {
-      std::fprintf(stderr, "tonvex note: cannot read note name '%s'\n", token.c_str());
-      return 2;
-    }
+    TTokenProblem problem = ReadNoteName(token, note);
+    if (problem != Token_Ok) return UsageError(Cmd_Note, TokenProblemText(problem, Kind_NoteName, token));
     notes.push_back(note);
   }
   for (std::size_t i = 0; i < notes.size(); ++i) {

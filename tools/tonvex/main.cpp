@@ -4,22 +4,8 @@
 #include "TonvexVersion.h"
 
 #include <cstdio>
-#include <cstring>
 
 namespace {
-
-const char* const Usage = "usage: tonvex COMMAND [ARGS...]\n"
-                          "\n"
-                          "Commands:\n"
-                          "  note NAME...   read note names and show their numbers, spellings and names\n"
-                          "  scale ROOT TYPE  show a scale's spelled degrees and key signature\n"
-                          "  key ROOT [minor] show a key's name, key signature and degrees\n"
-                          "\n"
-                          "Options:\n"
-                          "  --help         show this text\n"
-                          "  --version      show the library version\n"
-                          "\n"
-                          "Run 'tonvex COMMAND --help' for the options of a command.\n";
 
 void PrintVersion() {
   // The version string starts with the four-character "@(#)" marker.
@@ -27,27 +13,42 @@ void PrintVersion() {
   std::printf("tonvex %g\n%s", TonvexVersionNumber, text);
 }
 
+std::string UsageOf(TCommand command) {
+  switch (command) {
+  case Cmd_Note: return NoteUsage();
+  case Cmd_Scale: return ScaleUsage();
+  case Cmd_Key: return KeyUsage();
+  case Cmd_Chord: break;
+  }
+  return ChordUsage();
+}
+
 } // namespace
 
+int UsageError(TCommand command, std::string const& text) {
+  const char* name = CommandName(command);
+  std::fprintf(stderr, "tonvex%s%s: %s\n", *name != '\0' ? " " : "", name, text.c_str());
+  return 2;
+}
+
 int main(int argc, char** argv) {
-  Args args(argv + 1, argv + argc);
-  if (args.empty()) {
-    std::fputs(Usage, stderr);
-    return 2;
-  }
-  std::string const command = args.front();
-  Args const rest(args.begin() + 1, args.end());
-  if (command == "--help" || command == "-h") {
-    std::fputs(Usage, stdout);
-    return 0;
-  }
-  if (command == "--version") {
+  CommandLine line;
+  std::string problem = ParseCommandLine(Args(argv + 1, argv + argc), line);
+  if (line.Version != 0) {
     PrintVersion();
     return 0;
   }
-  if (command == "note") return RunNoteCommand(rest);
-  if (command == "scale") return RunScaleCommand(rest);
-  if (command == "key") return RunKeyCommand(rest);
-  std::fprintf(stderr, "tonvex: unknown command '%s'\n%s", command.c_str(), Usage);
-  return 2;
+  if (line.Help != 0) {
+    std::fputs(UsageOf(line.Command).c_str(), stdout);
+    return 0;
+  }
+  if (!problem.empty()) return UsageError(line.Command, problem);
+  ApplyNamingPreferences(line);
+  switch (line.Command) {
+  case Cmd_Note: return RunNoteCommand(line);
+  case Cmd_Scale: return RunScaleCommand(line);
+  case Cmd_Key: return RunKeyCommand(line);
+  case Cmd_Chord: break;
+  }
+  return RunChordCommand(line);
 }

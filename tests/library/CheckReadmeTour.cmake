@@ -1,0 +1,10 @@
+# The README shows examples/tour.cpp and its output verbatim: both must stand in it.
+cmake_minimum_required(VERSION 3.25)
+file(READ "${README}" readme)
+foreach(file IN ITEMS "${SOURCE}" "${EXPECTED}")
+  file(READ "${file}" text)
+  string(FIND "${readme}" "${text}" position)
+  if(position EQUAL -1)
+    message(FATAL_ERROR "README.md does not contain ${file} verbatim; copy it into the README again")
+  endif()
+endforeach()

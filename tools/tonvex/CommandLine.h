@@ -1,0 +1,66 @@
+// The arguments of the tonvex program: a command word, its operands and options.
+//
+// Options may stand anywhere (before or after the command word and the operands);
+// "--" ends them, so that later arguments are operands even if they start with '-'.
+// An option's value follows it as the next argument or after '=' ("--maj7 j7",
+// "--maj7=j7"). Each option applies to the commands that can use it; any other
+// command rejects it, rather than ignoring it, so that a misplaced option is noticed.
+#ifndef TONVEX_TOOLS_COMMANDLINE_H
+#define TONVEX_TOOLS_COMMANDLINE_H
+
+#include <string>
+#include <vector>
+
+using Args = std::vector<std::string>;
+
+/// The commands, as bits so that an option can name the commands it applies to.
+enum TCommand : unsigned { Cmd_Chord = 1u, Cmd_Note = 2u, Cmd_Scale = 4u, Cmd_Key = 8u };
+
+struct CommandLine {
+  TCommand Command = Cmd_Chord;
+  /// The operands after the command word.
+  Args Operands;
+  int Help = 0;
+  int Version = 0;
+
+  // Naming preferences, applied by ApplyNamingPreferences.
+  int German = 0;
+  int Solfege = 0;
+  int BIsH = 0;
+  int BbIsB = 0;
+  int MinorSmall = 0;
+  int SeparateBlocks = 0;
+  int Maj7ShownAs = 0; // 0 ma7, 1 j7, 2 maj7
+  int OptionSep = 0;   // 0 slash, 1 parentheses
+  int OctaveOf60 = 0;  // 0 octave 3, 1 octave 4, 2 octave 5
+  int SlashAlways = 0; // 0 only for chords wider than an octave, 1 always
+  int KeepLonelyBass = 0;
+
+  // Chord settings.
+  int RulesAlgo = 0; // 0 the built-in net finds the root, 1 the rules
+  int Json = 0;
+  int KeyNumbers = 0;
+  std::string Key;  // empty: no key
+  std::string Root; // empty: find the root
+};
+
+/// Reads the arguments (without the program name) into line. Returns the empty
+/// string on success, else a one-line description of the first problem (an unknown
+/// option, a missing or unknown value, an option that does not apply to the
+/// command). --help and --version are reported even when other options are wrong,
+/// so that help is always reachable.
+std::string ParseCommandLine(Args const& args, CommandLine& line);
+
+/// Sets the process-wide naming preferences from the options.
+void ApplyNamingPreferences(CommandLine const& line);
+
+/// The command's name as typed ("note"); the empty string for the chord command.
+const char* CommandName(TCommand command);
+
+/// Help text of the naming options, for the usage texts of the commands.
+extern const char* const NoteNameOptionsHelp;  // --b-is-h, --bb-is-b
+extern const char* const NameStyleOptionsHelp; // --german, --solfege
+extern const char* const OctaveOptionHelp;     // --octave-of-60
+extern const char* const ChordNameOptionsHelp; // chord name preferences
+
+#endif

@@ -9,6 +9,7 @@
 
 #include "ChordnamePref.h"
 #include "Note.h"
+#include "Scale.h"
 
 #include <fuzzer/FuzzedDataProvider.h>
 
@@ -52,7 +53,8 @@ public:
   /// A note as a host can make one: through the constructor (clamped), or moved by
   /// the octave and key number setters and the parser to the numbers that the
   /// setters let through (negative after SetOct below octave -1, 128..131 in octave
-  /// 9, 253 from the undefined note, 255 itself).
+  /// 9, 253 from the undefined note, 255 itself); now and then spelled by a scale
+  /// whose table holds any value, which leaves the spelling unchecked.
   CNote Note() {
     CNote note(AnyInt(), Enh());
     switch (Pick(5)) {
@@ -63,6 +65,11 @@ public:
     default: break;
     }
     if (Bool()) note.SetKeyNr(AnyInt());
+    if (Pick(8) == 0) {
+      CScale scale;
+      scale.SetEnhForKeyNr(note.KeyNr(), static_cast<TEnh>(AnyInt()));
+      note.AdjustEnhToScale(scale);
+    }
     return note;
   }
 

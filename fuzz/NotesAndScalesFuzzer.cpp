@@ -23,7 +23,7 @@ void NameNote(CNote const& note) {
 void ParseAndName(CFuzzInput& in) {
   CNote note = in.Note();
   CNote const before = note;
-  if (!note.SetFromString(in.Text(64), DefaultChordnamePref)) Require(note == before && note.Enh() == before.Enh());
+  if (!note.SetFromString(in.Text(64), DefaultChordnamePref)) Require(note == before);
   NameNote(note);
 }
 
@@ -76,7 +76,7 @@ void Measure(CFuzzInput& in) {
 
 void CheckScale(CScale const& scale, CFuzzInput& in) {
   int const n = scale.DegreesPerOctave();
-  Require(scale.RootNote().NoteNr() >= 0 && scale.RootNote().NoteNr() <= 11);
+  Require(scale.RootNote().NoteNr() >= 0 && scale.RootNote().NoteNr() <= 11 && scale.RootNote().HasSensefulEnh());
   for (int k = 0; k < 4; ++k) {
     int const d = in.AnyInt();
     int const keyNr = scale.DegreeNrToKeyNr(d);

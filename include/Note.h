@@ -159,7 +159,9 @@ TONVEX_API TEnh MakeSensefulEnhForKeyNr(int keyNr, TEnh enh);
 TONVEX_API int IntvlFromTo(CNote const& a, CNote const& b);
 /// |a.NoteNr - b.NoteNr|.
 TONVEX_API int DistanceBetween(CNote const& a, CNote const& b);
-/// b.KeyNr - a.KeyNr, not normalised (-11..11).
+/// b.KeyNr - a.KeyNr, not normalised (-11..11). Each key number is taken as its
+/// pitch class 0..11 first, so a note with a negative note number (left by SetOct
+/// or the parser) counts by its pitch class here and in the three functions below.
 TONVEX_API int KeyIntvlFromTo(CNote const& a, CNote const& b);
 /// The key number difference brought into 0..11.
 TONVEX_API int AbsKeyIntvlFromTo(CNote const& a, CNote const& b);

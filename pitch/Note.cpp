@@ -151,7 +151,10 @@ std::ostream& operator<<(std::ostream& os, CNote const& note) {
 
 int IntvlFromTo(CNote const& a, CNote const& b) { return static_cast<int>(b.NoteNr() - a.NoteNr()); }
 int DistanceBetween(CNote const& a, CNote const& b) { return std::abs(IntvlFromTo(a, b)); }
-int KeyIntvlFromTo(CNote const& a, CNote const& b) { return b.KeyNr() - a.KeyNr(); }
+// The key numbers are taken as pitch classes: SetOct and the parser leave negative
+// note numbers, whose negative key numbers would push the differences to -22..22
+// and the distances below out of their ranges.
+int KeyIntvlFromTo(CNote const& a, CNote const& b) { return PitchClass(b.KeyNr()) - PitchClass(a.KeyNr()); }
 
 int AbsKeyIntvlFromTo(CNote const& a, CNote const& b) { return PitchClass(KeyIntvlFromTo(a, b)); }
 

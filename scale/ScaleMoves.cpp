@@ -11,7 +11,9 @@ struct Candidate {
   int degree;
 };
 
-int Distance(int a, int b) { return a > b ? a - b : b - a; }
+// Plain difference of two key numbers; k may be any int, so the difference is
+// taken in 64 bits (0 - INT_MIN does not fit an int).
+long long Distance(long long a, long long b) { return a > b ? a - b : b - a; }
 
 constexpr long HighestNoteNr = 127;
 
@@ -41,7 +43,7 @@ int CScale::KeyNrQuantizeToDegreeNr(int k, TQuantizeToScaleDirection dir) const 
     if (takeLower) lower = {kd, d};
     if (takeUpper) upper = {kd, d};
   }
-  int toUpper = Distance(upper.keyNr, k), toLower = Distance(lower.keyNr, k);
+  long long toUpper = Distance(upper.keyNr, k), toLower = Distance(lower.keyNr, k);
   if (toUpper != toLower) return toUpper < toLower ? upper.degree : lower.degree;
   return dir == Quantize_Up ? upper.degree : lower.degree;
 }

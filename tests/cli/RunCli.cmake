@@ -7,7 +7,13 @@ cmake_minimum_required(VERSION 3.25)
 #   STDOUT         optional '@@'-separated regular expressions that standard output must match
 #   STDOUT_EXACT   optional file whose contents standard output must equal
 #   STDERR         optional '@@'-separated regular expressions that standard error must match
+# The environment variable TONVEX_CLI_LAUNCHER may name a command line that the
+# program runs under, such as valgrind and its options (tools/valgrind-check.sh).
 string(REPLACE "|" ";" args "${ARGS}")
+set(launcher)
+if(DEFINED ENV{TONVEX_CLI_LAUNCHER})
+  separate_arguments(launcher UNIX_COMMAND "$ENV{TONVEX_CLI_LAUNCHER}")
+endif()
 if(NOT DEFINED EXIT)
   set(EXIT 0)
 endif()
@@ -15,7 +21,7 @@ set(input_option)
 if(INPUT)
   set(input_option INPUT_FILE "${INPUT}")
 endif()
-execute_process(COMMAND "${PROGRAM}" ${args} ${input_option}
+execute_process(COMMAND ${launcher} "${PROGRAM}" ${args} ${input_option}
   RESULT_VARIABLE status OUTPUT_VARIABLE out ERROR_VARIABLE err)
 set(report "command: ${PROGRAM} ${args}\nstatus: ${status}\nstdout:\n${out}\nstderr:\n${err}")
 if(NOT status STREQUAL EXIT)

@@ -143,4 +143,32 @@ TEST(NoteNumber, DistancesOverAllPairs) {
   EXPECT_EQ(IntvlFromTo(CNote_Undef, CNote(0, Enh_Natural)), -255);
 }
 
+// SetOct below octave -1 leaves minus the key number (0..-11), octave 9 leaves
+// 128..131 and SetKeyNr on the undefined note 253: the key number differences and
+// distances stay in their ranges, counted by pitch class.
+TEST(NoteNumber, DistancesOfNoteNumbersOutsideTheRange) {
+  std::vector<CNote> notes;
+  for (int k = 0; k < 12; ++k) {
+    CNote below(k, Enh_Natural);
+    below.SetOct(-2);
+    CNote above(k, Enh_Natural);
+    above.SetOct(9);
+    notes.insert(notes.end(), {below, above, CNote(60 + k, Enh_Natural)});
+  }
+  CNote undefinedMoved = CNote_Undef;
+  undefinedMoved.SetKeyNr(1);
+  notes.insert(notes.end(), {undefinedMoved, CNote_Undef});
+  ASSERT_EQ(notes[3 * 11].NoteNr(), -11);
+  ASSERT_EQ(notes[3 * 11 + 1].NoteNr(), 131);
+  ASSERT_EQ(undefinedMoved.NoteNr(), 253);
+  for (CNote const& a : notes)
+    for (CNote const& b : notes) {
+      int ka = static_cast<int>((a.NoteNr() % 12 + 12) % 12), kb = static_cast<int>((b.NoteNr() % 12 + 12) % 12);
+      EXPECT_EQ(KeyIntvlFromTo(a, b), kb - ka) << a << " " << b;
+      EXPECT_EQ(AbsKeyIntvlFromTo(a, b), (kb - ka + 12) % 12) << a << " " << b;
+      EXPECT_EQ(KeyDistanceBetween(a, b), std::min((kb - ka + 12) % 12, (ka - kb + 12) % 12)) << a << " " << b;
+      EXPECT_EQ(SmallestKeyIntvlBetween(a, b), Shortest(ka, kb)) << a << " " << b;
+    }
+}
+
 } // namespace

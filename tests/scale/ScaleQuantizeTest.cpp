@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <climits>
 #include <cstdlib>
 
 namespace {
@@ -39,9 +40,18 @@ int ExpectedKeyNr(std::vector<int> const& keys, int root, int k, bool tieUp) {
       for (int key : keys)
         if (key >= k) upper = std::min(upper, key);
   }
-  int toUpper = std::abs(upper - k), toLower = std::abs(lower - k);
+  long long toUpper = std::llabs(upper - static_cast<long long>(k));
+  long long toLower = std::llabs(lower - static_cast<long long>(k));
   if (toUpper != toLower) return toUpper < toLower ? upper : lower;
   return tieUp ? upper : lower;
+}
+
+// Key numbers around the octave, and far outside it: a host may pass any int, and the
+// differences to INT_MIN and INT_MAX do not fit an int.
+std::vector<int> KeyNumbersToSnap() {
+  std::vector<int> keyNrs = {INT_MIN, INT_MIN + 1, -1000000, 1000000, INT_MAX - 1, INT_MAX};
+  for (int k = -3; k <= 14; ++k) keyNrs.push_back(k);
+  return keyNrs;
 }
 
 TEST(ScaleQuantize, EveryKeyNumberRootTypeAndDirection) {
@@ -50,7 +60,7 @@ TEST(ScaleQuantize, EveryKeyNumberRootTypeAndDirection) {
       CScale const scale(CNote(root, Enh_Natural), T(type));
       std::vector<int> keys;
       for (int interval : scaleoracle::DegreeIntervals(type)) keys.push_back((root + interval) % 12);
-      for (int k = -3; k <= 14; ++k)
+      for (int k : KeyNumbersToSnap())
         for (int dir : {0, 1, 2, -1}) {
           int degree = scale.KeyNrQuantizeToDegreeNr(k, static_cast<CScale::TQuantizeToScaleDirection>(dir));
           ASSERT_GE(degree, 0);
@@ -85,6 +95,10 @@ TEST(ScaleQuantize, WorkedExamples) {
   // candidate stays on E.
   CScale const eMajor(CNote(4, Enh_Natural), CScale::Scale_Major);
   EXPECT_EQ(eMajor.KeyNrQuantizeToDegreeNr(7, CScale::Quantize_Up), 1);
+  // Far below the octave the nearest candidate is the scale's lowest key number, far
+  // above it the highest: in G major C (degree 3) and B (degree 2).
+  EXPECT_EQ(gMajor.KeyNrQuantizeToDegreeNr(INT_MIN, CScale::Quantize_Up), 3);
+  EXPECT_EQ(gMajor.KeyNrQuantizeToDegreeNr(INT_MAX, CScale::Quantize_Up), 2);
 }
 
 } // namespace

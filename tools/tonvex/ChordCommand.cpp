@@ -96,20 +96,12 @@ int NameChordsOfLines(CChordNamer& namer, bool json) {
   int status = 0;
   while (std::getline(std::cin, text)) {
     ++lineNr;
-    namer.Clear();
-    std::string const problem = namer.Read(text);
+    std::string const problem = namer.NameLine(text, lineNr, json, out);
     if (!problem.empty()) {
       std::fprintf(stderr, "tonvex: line %ld: %s\n", lineNr, problem.c_str());
       status = 1;
       continue;
     }
-    if (namer.Empty()) continue;
-    namer.Analyse();
-    if (json)
-      namer.AppendJson(out, lineNr);
-    else
-      out += namer.Name();
-    out += '\n';
     if (eachLine || out.size() >= OutputBlock) {
       if (!Write(out)) return Finish(1);
       if (eachLine) std::fflush(stdout);

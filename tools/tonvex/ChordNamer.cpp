@@ -210,3 +210,16 @@ void CChordNamer::AppendJson(std::string& out, long lineNr) const {
   }
   json.EndObject();
 }
+
+std::string CChordNamer::NameLine(std::string_view line, long lineNr, bool json, std::string& out) {
+  Clear();
+  std::string problem = Read(line);
+  if (!problem.empty() || Empty()) return problem;
+  Analyse();
+  if (json)
+    AppendJson(out, lineNr);
+  else
+    out += Name_;
+  out += '\n';
+  return problem;
+}

@@ -51,6 +51,13 @@ public:
   /// written first as "line".
   void AppendJson(std::string& out, long lineNr) const;
 
+  /// Names the chord of one line of input, as the batch mode does: reads it
+  /// (forgetting the notes before), and unless it holds no notes appends the name,
+  /// or with `json` the JSON object carrying lineNr, and a line end to out. Returns
+  /// the empty string, or the problem with the line's first token that is not a
+  /// note; then nothing is appended.
+  std::string NameLine(std::string_view line, long lineNr, bool json, std::string& out);
+
 private:
   std::string NoteName(CNote const& note) const;
   // The chord's notes whose pitch class is not among the key's degrees.

@@ -1,7 +1,9 @@
 #include "CommandLine.h"
+#include "Commands.h"
 
 #include "ChordnamePref.h"
 
+#include <cstdio>
 #include <cstring>
 
 namespace {
@@ -103,6 +105,12 @@ const char* CommandName(TCommand command) {
   case Cmd_Key: return "key";
   }
   return "";
+}
+
+int UsageError(TCommand command, std::string const& text) {
+  const char* name = CommandName(command);
+  std::fprintf(stderr, "tonvex%s%s: %s\n", *name != '\0' ? " " : "", name, text.c_str());
+  return 2;
 }
 
 std::string ParseCommandLine(Args const& args, CommandLine& line) {

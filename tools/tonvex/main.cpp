@@ -25,12 +25,6 @@ std::string UsageOf(TCommand command) {
 
 } // namespace
 
-int UsageError(TCommand command, std::string const& text) {
-  const char* name = CommandName(command);
-  std::fprintf(stderr, "tonvex%s%s: %s\n", *name != '\0' ? " " : "", name, text.c_str());
-  return 2;
-}
-
 int main(int argc, char** argv) {
   CommandLine line;
   std::string problem = ParseCommandLine(Args(argv + 1, argv + argc), line);

@@ -32,7 +32,7 @@ for program in "$build"/fuzz/fuzz_*; do
   # Standard output is closed: the net file readers print every value they read.
   if "$program" "${limit[@]}" -close_fd_mask=1 -artifact_prefix="$work/artifacts/$target-" \
     "$work/$target" "fuzz/corpus/$target" >"$log" 2>&1; then
-    echo "$target: $(grep -E '^#[0-9]+ +DONE' "$log" | tail -n 1)"
+    echo "$target: $(grep -E '^#[0-9]+[[:space:]]+DONE' "$log" | tail -n 1)"
   else
     echo "$target: FAILED, see $log" >&2
     tail -n 60 "$log" >&2

@@ -207,7 +207,7 @@ TEST_F(PackedForwardTest, FollowsTheProcessWideParameters) {
   std::vector<float> const in = RandomValues(random, 5, false);
   std::vector<float> const changed = RandomValues(random, WeightCount(shape), false);
   TPredefinedWeights record = shape;
-  record.weights = const_cast<float*>(flat.data());
+  record.weights = flat.data();
   NeuronalNet net(record);
   net.use(in);
   std::vector<float> const fast = net.get_outputs();

@@ -3,8 +3,8 @@
 #ifndef TONVEX_BENCH_BENCHSUPPORT_H
 #define TONVEX_BENCH_BENCHSUPPORT_H
 
-#include "Chord.h"
 #include "support/AllocationCounter.h"
+#include <tonvex/Chord.h>
 
 #include <benchmark/benchmark.h>
 

@@ -1,8 +1,8 @@
 // The forward pass of a net of the built-in net's shape and weights.
 #include "BenchSupport.h"
-#include "ChordAnalysisNet.h"
-#include "NeuronalNet.h"
 #include "Voicings.h"
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 namespace {
 

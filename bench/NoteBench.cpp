@@ -1,7 +1,7 @@
 // Notes and scales: naming, parsing, building a scale's spelling table.
 #include "BenchSupport.h"
-#include "NoteNames.h"
-#include "Scale.h"
+#include <tonvex/NoteNames.h>
+#include <tonvex/Scale.h>
 
 #include <string>
 #include <utility>

@@ -2,7 +2,7 @@
 #ifndef TONVEX_BENCH_VOICINGS_H
 #define TONVEX_BENCH_VOICINGS_H
 
-#include "MySet.h"
+#include <tonvex/MySet.h>
 
 #include <cstdint>
 #include <vector>

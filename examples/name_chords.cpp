@@ -1,5 +1,5 @@
 // Names notes, keys and chords through the public Tonvex interface.
-#include <Tonvex.h>
+#include <tonvex/Tonvex.h>
 
 #include <iostream>
 

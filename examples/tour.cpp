@@ -1,6 +1,6 @@
 // A guided tour of the library: notes, names, keys and scales, chords, root finding,
 // harmonic function and the naming preferences. Its output is in tour.expected.
-#include <Tonvex.h>
+#include <tonvex/Tonvex.h>
 
 #include <iostream>
 

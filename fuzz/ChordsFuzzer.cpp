@@ -3,8 +3,8 @@
 // the XG chord type, under any preferences.
 #include "FuzzInput.h"
 
-#include "Chord.h"
-#include "SignKey.h"
+#include <tonvex/Chord.h>
+#include <tonvex/SignKey.h>
 
 #include <sstream>
 

@@ -7,9 +7,9 @@
 #ifndef TONVEX_FUZZ_FUZZINPUT_H
 #define TONVEX_FUZZ_FUZZINPUT_H
 
-#include "ChordnamePref.h"
-#include "Note.h"
-#include "Scale.h"
+#include <tonvex/ChordnamePref.h>
+#include <tonvex/Note.h>
+#include <tonvex/Scale.h>
 
 #include <fuzzer/FuzzedDataProvider.h>
 

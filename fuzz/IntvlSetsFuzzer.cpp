@@ -3,8 +3,8 @@
 // chord type catalogue's lookups by any id.
 #include "FuzzInput.h"
 
-#include "ChordTypes.h"
-#include "IntvlSet.h"
+#include <tonvex/ChordTypes.h>
+#include <tonvex/IntvlSet.h>
 
 #include <sstream>
 #include <vector>

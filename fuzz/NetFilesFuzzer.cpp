@@ -3,7 +3,7 @@
 // text forms and a little training.
 #include "FuzzInput.h"
 
-#include "NeuronalNet.h"
+#include <tonvex/NeuronalNet.h>
 
 #include <cstdio>
 #include <fstream>

@@ -2,9 +2,9 @@
 // with any root, type, degree, key number and step count.
 #include "FuzzInput.h"
 
-#include "NoteNames.h"
-#include "Scale.h"
-#include "SignKey.h"
+#include <tonvex/NoteNames.h>
+#include <tonvex/Scale.h>
+#include <tonvex/SignKey.h>
 
 #include <sstream>
 

@@ -15,7 +15,7 @@
 #ifndef TONVEX_TRAINING_CHORDNETSOURCE_H
 #define TONVEX_TRAINING_CHORDNETSOURCE_H
 
-#include "NeuronalNet.h"
+#include <tonvex/NeuronalNet.h>
 
 #include <string>
 #include <vector>

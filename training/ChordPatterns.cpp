@@ -1,8 +1,8 @@
 // Chord voicings, their labels and their encoding for the chord analysis net.
 #include "training/ChordPatterns.h"
 
-#include "Chord.h"
-#include "ChordTypes.h"
+#include <tonvex/Chord.h>
+#include <tonvex/ChordTypes.h>
 
 #include <algorithm>
 #include <map>

@@ -52,8 +52,8 @@
 #ifndef TONVEX_TRAINING_CHORDPATTERNS_H
 #define TONVEX_TRAINING_CHORDPATTERNS_H
 
-#include "NeuronalNet.h"
-#include "TrainingPattern.h"
+#include <tonvex/NeuronalNet.h>
+#include <tonvex/TrainingPattern.h>
 
 #include <string>
 #include <vector>

@@ -5,7 +5,7 @@
 // the clean glyphs the net is asked to read them again and to read noisy copies
 // with one or two pixels flipped. Exits with 0 when all ten clean digits and at
 // least 18 of the 20 noisy copies are recognised.
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <cstdio>
 #include <cstdlib>

@@ -6,8 +6,8 @@
 #ifndef TONVEX_TRAINING_ROOTACCURACY_H
 #define TONVEX_TRAINING_ROOTACCURACY_H
 
-#include "Chord.h"
 #include "training/ChordPatterns.h"
+#include <tonvex/Chord.h>
 
 #include <cstddef>
 #include <vector>

@@ -41,7 +41,7 @@
 #include "training/ChordPatterns.h"
 #include "training/LogWriter.h"
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <algorithm>
 #include <cstdio>

@@ -5,7 +5,7 @@
 // activation threshold is the only offset, which is why the threshold is not 0.
 // Prints the training messages, each pattern's outputs and the recognition result;
 // exits with 0 when all four patterns are recognised.
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <cstdio>
 #include <cstdlib>

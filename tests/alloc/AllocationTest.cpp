@@ -1,10 +1,10 @@
 // What a host does for every chord allocates nothing on the heap, but the name it
 // gets back when the name is too long for the string's inline buffer. Allocations
 // are counted by the operator new of support/AllocationCounter.cpp.
-#include "Chord.h"
-#include "ChordAnalysisNet.h"
-#include "NeuronalNet.h"
 #include "support/AllocationCounter.h"
+#include <tonvex/Chord.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

@@ -2,9 +2,9 @@
 // chord type and the key sign count of a chord. Expectations come from a
 // classification written out from the recognition rules as a first-match list, from
 // the XG rows read as data, and from the letter model of tests/support.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

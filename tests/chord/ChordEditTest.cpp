@@ -1,8 +1,8 @@
 // Chord edits: setting from sets, transposing, inverting, placing lowest notes, the
 // comping range and moving notes between intervals. Expected note numbers are
 // counted out by hand from the octave rules or found by searching a note range.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

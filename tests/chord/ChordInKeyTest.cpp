@@ -1,9 +1,9 @@
 // A chord in a key: harmonic function codes, closeness to the key, the notes and
 // intervals outside it. Expectations come from the degree tables of major and minor
 // keys, the function codes and the closeness tables, all written out here as data.
-#include "Chord.h"
-#include "SignKey.h"
 #include "support/ChordBuilders.h"
+#include <tonvex/Chord.h>
+#include <tonvex/SignKey.h>
 
 #include <gtest/gtest.h>
 

@@ -1,8 +1,8 @@
 // The chord model: construction, the root, the notes, the lazily rebuilt interval
 // cache and its lonely-lowest-note mark, the key number queries, comparisons and the
 // undefined chord. Expectations are counted out by hand or from std::set models.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

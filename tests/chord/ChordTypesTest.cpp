@@ -1,5 +1,5 @@
 // The chord type catalogue: the built-in list read as data, lookups, user types.
-#include "ChordTypes.h"
+#include <tonvex/ChordTypes.h>
 
 #include <gtest/gtest.h>
 

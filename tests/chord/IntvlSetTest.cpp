@@ -1,7 +1,7 @@
 // Interval sets: insertion rule, value lists and their end tests, membership queries,
 // the one-sided comparison, inversion and printing. Expectations come from bit masks,
 // std::set models and plain octave counting, never from CIntvlSet itself.
-#include "IntvlSet.h"
+#include <tonvex/IntvlSet.h>
 
 #include <gtest/gtest.h>
 

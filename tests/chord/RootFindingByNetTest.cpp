@@ -4,12 +4,12 @@
 // for the compiled-in weights and, for every pitch class set, from a separate net
 // built from the exported data. Spelling is checked in RootSpellingTest.cpp, the
 // chord without notes in RootFindingTest.cpp.
-#include "Chord.h"
-#include "ChordAnalysisNet.h"
-#include "NeuronalNet.h"
 #include "support/ChordBuilders.h"
 #include "support/NeuronParamGuard.h"
 #include "support/SpellingOracle.h"
+#include <tonvex/Chord.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

@@ -2,9 +2,9 @@
 // the root are checked against a model written from their description: the weight
 // tables as data, the intervals computed from the notes' pitch classes, the special
 // chords, the tie and the distance rules. Spelling is checked in RootSpellingTest.cpp.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

@@ -2,10 +2,10 @@
 // and the notes spelled after the root's scale. Expectations come from the letter
 // model of tests/support (sign counts, senseful spellings) and the letter-built scales
 // of tests/scale.
-#include "Chord.h"
 #include "scale/ScaleOracle.h"
 #include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 // Chord names: the basic chord texts, the block after the root with its kept
 // blanks, names with and without a slash bass under the naming preferences, the
 // undefined root, and names for another root. Expected strings are written out.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
 #include "support/SpellingOracle.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

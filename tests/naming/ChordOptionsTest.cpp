@@ -1,9 +1,9 @@
 // Chord options of recognised chords: the map of ranks, the texts, their joining
 // under both separators, the lonely-lowest-note rule and the undefined root. The
 // expected ranks and strings are written out from the rule table.
-#include "Chord.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
+#include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
 

@@ -1,10 +1,10 @@
 // Harmonic function names of chords in keys: chords built on every degree with
 // every basic chord in all major and minor keys, named in both styles.
-#include "Chord.h"
 #include "HarmFuncTable.h"
-#include "SignKey.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
+#include <tonvex/Chord.h>
+#include <tonvex/SignKey.h>
 
 #include <gtest/gtest.h>
 

@@ -3,8 +3,8 @@
 #include "chord/NetForSingleChordAnalysis.h"
 #include "support/NeuronParamGuard.h"
 
-#include <ChordAnalysisNet.h>
-#include <NeuronalNet.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

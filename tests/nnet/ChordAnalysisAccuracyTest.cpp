@@ -3,8 +3,8 @@
 #include "support/NeuronParamGuard.h"
 #include "training/ChordPatterns.h"
 
-#include <ChordAnalysisNet.h>
-#include <NeuronalNet.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

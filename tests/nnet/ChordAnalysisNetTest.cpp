@@ -4,8 +4,8 @@
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
 
-#include <ChordAnalysisNet.h>
-#include <NeuronalNet.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

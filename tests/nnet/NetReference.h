@@ -5,7 +5,7 @@
 #ifndef TONVEX_TESTS_NETREFERENCE_H
 #define TONVEX_TESTS_NETREFERENCE_H
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <cmath>
 #include <vector>

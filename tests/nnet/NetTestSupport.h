@@ -4,7 +4,7 @@
 
 #include "support/NeuronParamGuard.h"
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

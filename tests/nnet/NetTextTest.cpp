@@ -3,7 +3,7 @@
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

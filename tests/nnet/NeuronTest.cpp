@@ -4,7 +4,7 @@
 #include "nnet/NetTestSupport.h"
 #include "support/NeuronParamGuard.h"
 
-#include <Neuron.h>
+#include <tonvex/Neuron.h>
 
 #include <gtest/gtest.h>
 

@@ -6,8 +6,8 @@
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
 
-#include <Neuron.h>
-#include <NeuronalNet.h>
+#include <tonvex/Neuron.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

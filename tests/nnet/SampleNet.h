@@ -3,7 +3,7 @@
 #ifndef TONVEX_TESTS_SAMPLENET_H
 #define TONVEX_TESTS_SAMPLENET_H
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <cstdlib>
 #include <vector>

@@ -3,7 +3,7 @@
 #include "SampleNet.h"
 #include "nnet/NetTestSupport.h"
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

@@ -3,7 +3,7 @@
 // commented out, so that a test can compile it.
 #include "SampleNet.h"
 
-#include <NeuronalNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <fstream>
 #include <iostream>

@@ -19,9 +19,9 @@ set(expected
 if(WITH_PROGRAM)
   list(APPEND expected ${BINDIR}/tonvex)
 endif()
-file(GLOB headers RELATIVE "${SOURCE_DIR}/include" "${SOURCE_DIR}/include/*.h")
+file(GLOB headers RELATIVE "${SOURCE_DIR}/include" "${SOURCE_DIR}/include/tonvex/*.h")
 foreach(header IN LISTS headers)
-  list(APPEND expected ${INCLUDEDIR}/tonvex/${header})
+  list(APPEND expected ${INCLUDEDIR}/${header})
 endforeach()
 
 file(GLOB_RECURSE installed RELATIVE "${PREFIX}" LIST_DIRECTORIES false "${PREFIX}/*")

@@ -1,6 +1,6 @@
 // CMySet behaves as an ordered set: checked against std::set on random operations.
-#include "MySet.h"
-#include "Note.h"
+#include <tonvex/MySet.h>
+#include <tonvex/Note.h>
 
 #include <gtest/gtest.h>
 

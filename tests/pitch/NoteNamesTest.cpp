@@ -1,7 +1,7 @@
 // Note names in every naming system and under every combination of the flags.
 #include "support/PrefGuard.h"
 
-#include "NoteNames.h"
+#include <tonvex/NoteNames.h>
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,5 @@
 // Note numbers, key numbers, octaves, comparisons and distances.
-#include "Note.h"
+#include <tonvex/Note.h>
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 // cases (accidentals that wrap, octaves read by atoi, the SetOct clamps).
 #include "support/PrefGuard.h"
 
-#include "Note.h"
+#include <tonvex/Note.h>
 
 #include <gtest/gtest.h>
 

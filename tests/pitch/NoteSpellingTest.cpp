@@ -1,7 +1,7 @@
 // Spelling rules of notes, checked against the letter model of SpellingOracle.h.
 #include "support/SpellingOracle.h"
 
-#include "Note.h"
+#include <tonvex/Note.h>
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // Moving notes by degrees within a scale.
 #include "ScaleOracle.h"
 
-#include "Scale.h"
+#include <tonvex/Scale.h>
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // Roots, degrees and key numbers of every scale type.
 #include "ScaleOracle.h"
 
-#include "Scale.h"
+#include <tonvex/Scale.h>
 
 #include <gtest/gtest.h>
 

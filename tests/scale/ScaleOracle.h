@@ -6,7 +6,7 @@
 
 #include "support/SpellingOracle.h"
 
-#include "Scale.h"
+#include <tonvex/Scale.h>
 
 #include <vector>
 

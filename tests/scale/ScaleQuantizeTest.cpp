@@ -1,7 +1,7 @@
 // Snapping key numbers onto a scale.
 #include "ScaleOracle.h"
 
-#include "Scale.h"
+#include <tonvex/Scale.h>
 
 #include <gtest/gtest.h>
 

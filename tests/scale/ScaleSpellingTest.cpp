@@ -1,8 +1,8 @@
 // Spelling tables and sign counts of scales against the letter model.
 #include "ScaleOracle.h"
 
-#include "NoteNames.h"
-#include "Scale.h"
+#include <tonvex/NoteNames.h>
+#include <tonvex/Scale.h>
 
 #include <gtest/gtest.h>
 

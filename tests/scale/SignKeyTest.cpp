@@ -2,7 +2,7 @@
 #include "ScaleOracle.h"
 #include "support/PrefGuard.h"
 
-#include "SignKey.h"
+#include <tonvex/SignKey.h>
 
 #include <gtest/gtest.h>
 

@@ -2,7 +2,7 @@
 #ifndef TONVEX_TESTS_CHORDBUILDERS_H
 #define TONVEX_TESTS_CHORDBUILDERS_H
 
-#include "Chord.h"
+#include <tonvex/Chord.h>
 
 #include <set>
 #include <string>

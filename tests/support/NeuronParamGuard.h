@@ -3,7 +3,7 @@
 #ifndef TONVEX_TESTS_NEURONPARAMGUARD_H
 #define TONVEX_TESTS_NEURONPARAMGUARD_H
 
-#include "Neuron.h"
+#include <tonvex/Neuron.h>
 
 class NeuronParamGuard {
 public:

@@ -8,7 +8,7 @@
 #ifndef TONVEX_TESTS_SPELLINGORACLE_H
 #define TONVEX_TESTS_SPELLINGORACLE_H
 
-#include "Note.h"
+#include <tonvex/Note.h>
 
 #include <optional>
 #include <vector>

@@ -3,8 +3,8 @@
 #include "training/ChordNetSource.h"
 #include "support/NeuronParamGuard.h"
 
-#include <ChordAnalysisNet.h>
-#include <NeuronalNet.h>
+#include <tonvex/ChordAnalysisNet.h>
+#include <tonvex/NeuronalNet.h>
 
 #include <gtest/gtest.h>
 

@@ -4,7 +4,7 @@
 #include "NoteToken.h"
 #include "SignsText.h"
 
-#include "ChordnamePref.h"
+#include <tonvex/ChordnamePref.h>
 
 namespace {
 

@@ -5,8 +5,8 @@
 #ifndef TONVEX_TOOLS_CHORDNAMER_H
 #define TONVEX_TOOLS_CHORDNAMER_H
 
-#include "Chord.h"
-#include "SignKey.h"
+#include <tonvex/Chord.h>
+#include <tonvex/SignKey.h>
 
 #include <string>
 #include <string_view>

@@ -1,7 +1,7 @@
 #include "CommandLine.h"
 #include "Commands.h"
 
-#include "ChordnamePref.h"
+#include <tonvex/ChordnamePref.h>
 
 #include <cstdio>
 #include <cstring>

@@ -2,8 +2,8 @@
 #include "Commands.h"
 #include "NoteToken.h"
 
-#include "ChordnamePref.h"
-#include "NoteNames.h"
+#include <tonvex/ChordnamePref.h>
+#include <tonvex/NoteNames.h>
 
 #include <cstdio>
 #include <vector>

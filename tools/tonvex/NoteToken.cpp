@@ -1,6 +1,6 @@
 #include "NoteToken.h"
 
-#include "ChordnamePref.h"
+#include <tonvex/ChordnamePref.h>
 
 namespace {
 

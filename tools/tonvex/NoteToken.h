@@ -6,7 +6,7 @@
 #ifndef TONVEX_TOOLS_NOTETOKEN_H
 #define TONVEX_TOOLS_NOTETOKEN_H
 
-#include "Note.h"
+#include <tonvex/Note.h>
 
 #include <string>
 #include <string_view>

@@ -4,9 +4,9 @@
 #include "NoteToken.h"
 #include "SignsText.h"
 
-#include "ChordnamePref.h"
-#include "Scale.h"
-#include "SignKey.h"
+#include <tonvex/ChordnamePref.h>
+#include <tonvex/Scale.h>
+#include <tonvex/SignKey.h>
 
 #include <cstdio>
 #include <cstdlib>

@@ -1,7 +1,7 @@
 // tonvex: chord analysis and naming from the command line.
 #include "Commands.h"
 
-#include "TonvexVersion.h"
+#include <tonvex/TonvexVersion.h>
 
 #include <cstdio>
 

@@ -17,6 +17,8 @@
 #ifndef TONVEX_MYSET_H
 #define TONVEX_MYSET_H
 
+#include "TonvexExport.h"
+
 #include <algorithm>
 #include <cstddef>
 #include <initializer_list>

@@ -94,6 +94,7 @@ public:
         throw CReadFailure{eventStart, "delta time " + std::to_string(delta) + " takes the track past tick " +
                                            std::to_string(MidiMaxTick)};
       Tick_ += delta;
+      File_.Tracks[static_cast<std::size_t>(TrackIx_)].EndTick = Tick_;
       std::size_t const statusPos = in.Pos();
       unsigned b = in.Byte("an event");
       if (b < 0x80) {
@@ -112,7 +113,6 @@ public:
     }
     for (auto& open : Open_)
       for (CMidiNote& note : open.second) EndNote(note, Tick_);
-    File_.Tracks[static_cast<std::size_t>(TrackIx_)].EndTick = Tick_;
   }
 
 private:

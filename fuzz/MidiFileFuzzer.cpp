@@ -1,7 +1,10 @@
-// The MIDI file reader on arbitrary bytes, then the time map of what it read. Stops
-// on a broken property: an error offset outside the input, a note that ends before
-// it starts or after its track, more events kept than the bytes could hold, a time
-// map that runs backwards.
+// The MIDI file reader on arbitrary bytes, then the time map and the chord timeline
+// of what it read, under settings taken from the last byte. Stops on a broken
+// property: an error offset outside the input, a note that ends before it starts or
+// after its track, more events kept than the bytes could hold, a time map that runs
+// backwards, a timeline whose segments do not follow each other from 0 or hold a
+// chord without notes.
+#include <tonvex/ChordTimeline.h>
 #include <tonvex/MidiFile.h>
 
 #include <cstdint>
@@ -34,6 +37,25 @@ void CheckTimeMap(CMidiFile const& file) {
   }
 }
 
+void CheckTimeline(CMidiFile const& file, unsigned char choice) {
+  CMidiTimeMap const map(file);
+  CChordTimelineSettings settings;
+  settings.Grid = static_cast<TChordGrid>(choice % 3);
+  settings.IncludeDrums = (choice & 4) != 0;
+  settings.AlignGridToOnsets = (choice & 8) == 0;
+  settings.Algo = (choice & 16) != 0 ? SCA_RULE_WEIGHTS : SCA_NEURONAL_NET;
+  settings.MinDuration = (choice & 32) != 0 ? 0.5 : 0.0;
+  std::vector<CChordSegment> const segments =
+      AnalyseChordTimeline(TimedNotesOf(file, map), TimedPedalsOf(file, map), map, settings);
+  double end = 0;
+  for (CChordSegment const& segment : segments) {
+    Check(segment.Start == end && segment.End > segment.Start);
+    Check(segment.Beat >= 1);
+    Check(segment.NoChord || (segment.Chord.NoteCount() >= 2 && !segment.Chord.IsUndefined()));
+    end = segment.End;
+  }
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
@@ -51,5 +73,6 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
     Check(note.Channel >= 0 && note.Channel < 16);
   }
   if (result.Ok()) CheckTimeMap(file);
+  if (size > 0) CheckTimeline(file, data[size - 1]);
   return 0;
 }

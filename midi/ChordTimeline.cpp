@@ -6,7 +6,10 @@
 
 #include <algorithm>
 #include <cmath>
+#include <functional>
 #include <limits>
+#include <queue>
+#include <utility>
 
 namespace {
 
@@ -64,38 +67,62 @@ void RunEvidence(std::vector<CTimelineUnit> const& units, CRun const& run, doubl
     }
 }
 
-// Joins chord runs shorter than minDuration seconds to the neighbouring chord run
-// whose chord scores better over them, left to right.
+// Joins chord runs shorter than minDuration seconds to a neighbouring chord run,
+// shortest first: to the one whose chord scores better over it. Runs of no chord
+// neither join nor take in others.
 void JoinShortRuns(std::vector<CRun>& runs, std::vector<CTimelineUnit> const& units, CMidiTimeMap const& map,
                    double phase, double minDuration, CChordScorer const& scorer) {
   if (!(minDuration > 0)) return;
+  std::size_t const n = runs.size();
   auto seconds = [&](CRun const& run) {
     return map.BeatPosToSeconds(double(units[run.End - 1].EndBeat) + phase) -
            map.BeatPosToSeconds(double(units[run.First].FirstBeat) + phase);
   };
+  // The runs as a list, linked both ways (n ends it); joined runs are dead.
+  std::vector<std::size_t> prev(n), next(n);
+  std::vector<bool> alive(n, true);
+  using CEntry = std::pair<double, std::size_t>;
+  std::priority_queue<CEntry, std::vector<CEntry>, std::greater<CEntry>> shortest;
+  for (std::size_t i = 0; i < n; ++i) {
+    prev[i] = i == 0 ? n : i - 1;
+    next[i] = i + 1;
+    if (runs[i].State != NoChordState && seconds(runs[i]) < minDuration) shortest.emplace(seconds(runs[i]), i);
+  }
+  auto isChord = [&](std::size_t i) { return i < n && runs[i].State != NoChordState; };
+  auto unlink = [&](std::size_t i) {
+    alive[i] = false;
+    if (prev[i] < n) next[prev[i]] = next[i];
+    if (next[i] < n) prev[next[i]] = prev[i];
+  };
   double weight[12], bass[12], scores[ChordStateCount];
-  for (std::size_t i = 0; i < runs.size(); ++i) {
-    CRun& run = runs[i];
-    if (run.State == NoChordState || seconds(run) >= minDuration) continue;
-    int const before = i > 0 ? runs[i - 1].State : NoChordState;
-    int const after = i + 1 < runs.size() ? runs[i + 1].State : NoChordState;
-    if (before == NoChordState && after == NoChordState) continue;
-    RunEvidence(units, run, weight, bass);
-    scorer.Score(weight, bass, scores);
-    if (after == NoChordState)
-      run.State = before;
-    else if (before == NoChordState)
-      run.State = after;
-    else
-      run.State = scores[before] >= scores[after] ? before : after;
+  while (!shortest.empty()) {
+    auto const [length, i] = shortest.top();
+    shortest.pop();
+    if (!alive[i] || length != seconds(runs[i])) continue;
+    std::size_t const p = prev[i], q = next[i];
+    if (!isChord(p) && !isChord(q)) continue;
+    bool toPrev = isChord(p);
+    if (isChord(p) && isChord(q)) {
+      RunEvidence(units, runs[i], weight, bass);
+      scorer.Score(weight, bass, scores);
+      toPrev = scores[runs[p].State] >= scores[runs[q].State];
+    }
+    std::size_t const into = toPrev ? p : q;
+    runs[into].First = std::min(runs[into].First, runs[i].First);
+    runs[into].End = std::max(runs[into].End, runs[i].End);
+    unlink(i);
+    // The runs on both sides of the joined one may now be one chord.
+    std::size_t const other = toPrev ? next[into] : prev[into];
+    if (other < n && runs[other].State == runs[into].State) {
+      runs[into].First = std::min(runs[into].First, runs[other].First);
+      runs[into].End = std::max(runs[into].End, runs[other].End);
+      unlink(other);
+    }
+    if (seconds(runs[into]) < minDuration) shortest.emplace(seconds(runs[into]), into);
   }
   std::vector<CRun> joined;
-  for (CRun const& run : runs) {
-    if (!joined.empty() && joined.back().State == run.State)
-      joined.back().End = run.End;
-    else
-      joined.push_back(run);
-  }
+  for (std::size_t i = 0; i < n; ++i)
+    if (alive[i]) joined.push_back(runs[i]);
   runs.swap(joined);
 }
 
@@ -144,10 +171,10 @@ std::vector<CChordSegment> AnalyseChordTimeline(std::vector<CTimedNote> const& n
   std::vector<CSoundingNote> const sounding = SoundingNotes(notes, pedals, map, settings);
   if (sounding.empty()) return segments;
   double lastEnd = 0;
-  for (CTimedNote const& note : notes)
-    if (TakesPart(note, settings)) lastEnd = std::max(lastEnd, note.End);
+  for (CSoundingNote const& note : sounding) lastEnd = std::max(lastEnd, note.End);
+  lastEnd = map.BeatPosToSeconds(lastEnd);
   double const phase = settings.AlignGridToOnsets ? OnsetPhase(sounding) : 0.0;
-  std::vector<CTimelineUnit> const units = TimelineUnits(sounding, phase, settings);
+  std::vector<CTimelineUnit> const units = TimelineUnits(sounding, phase, map, settings);
   CChordScorer const scorer(settings);
   std::vector<CRun> runs = Runs(ChooseChords(units, ChangeCosts(units, map, settings), scorer));
   JoinShortRuns(runs, units, map, phase, settings.MinDuration, scorer);

@@ -51,13 +51,13 @@ double SustainedEnd(CPedalTimeline const* pedal, double end, double nextStrike, 
   return std::max(end, std::min({release, nextStrike, lastEnd}));
 }
 
-} // namespace
-
 bool TakesPart(CTimedNote const& note, CChordTimelineSettings const& settings) {
   if (!settings.IncludeDrums && note.Channel == MidiDrumChannel) return false;
   return note.NoteNr >= 0 && note.NoteNr < 128 && std::isfinite(note.Start) && std::isfinite(note.End) &&
          note.End > note.Start;
 }
+
+} // namespace
 
 std::vector<CSoundingNote> SoundingNotes(std::vector<CTimedNote> const& notes, std::vector<CTimedPedal> const& pedals,
                                          CMidiTimeMap const& map, CChordTimelineSettings const& settings) {
@@ -126,9 +126,8 @@ double OnsetPhase(std::vector<CSoundingNote> const& notes) {
 
 namespace {
 
-bool StartsOffBeatAndShort(CSoundingNote const& note, double phase) {
-  double const pos = note.Start - phase;
-  double const offset = std::abs(pos - std::round(pos));
+bool StartsOffBeatAndShort(CSoundingNote const& note) {
+  double const offset = std::abs(note.Start - std::round(note.Start));
   return offset > OnBeatTolerance && note.Release - note.Start < 1.0;
 }
 
@@ -144,42 +143,60 @@ double Sounded(CSoundingNote const& note, double from, double to, double halfLif
   return note.Loudness * (held + tail);
 }
 
-// The lowest note sounding at pos: among the held notes, or if none is held, among
-// those the pedal sustains. 128 when none sounds.
-int LowestAt(std::vector<CSoundingNote const*> const& active, double pos) {
-  int held = 128, sustained = 128;
-  for (CSoundingNote const* note : active) {
-    if (pos < note->Start || pos >= note->End) continue;
-    int& lowest = pos < note->Release ? held : sustained;
-    lowest = std::min(lowest, note->NoteNr);
-  }
-  return held < 128 ? held : sustained;
-}
+// Where a note starts or stops being held or sustained within a unit.
+struct CBassEvent {
+  double Pos;
+  int NoteNr;
+  int Held, Sustained; // changes of the counts
+};
 
-// Weight and bass of one unit from the notes sounding in it.
-void Gather(CTimelineUnit& unit, std::vector<CSoundingNote const*> const& active, double phase,
-            CChordTimelineSettings const& settings) {
-  double const u0 = double(unit.FirstBeat) + phase;
-  double const u1 = double(unit.EndBeat) + phase;
-  std::vector<double> cuts = {u0, u1};
+// How long each pitch class is the lowest note in [u0, u1): the lowest of the held
+// notes, or while none is held, the lowest of those the pedal sustains. Returns the
+// time anything sounds.
+double GatherBass(std::vector<CSoundingNote const*> const& active, double u0, double u1, double bass[12]) {
+  std::vector<CBassEvent> events;
   for (CSoundingNote const* note : active) {
     double const from = std::max(note->Start, u0), to = std::min(note->End, u1);
     if (to <= from) continue;
-    double const factor = StartsOffBeatAndShort(*note, phase) ? settings.OffBeatWeight : 1.0;
-    unit.Weight[note->NoteNr % 12] += Sounded(*note, from, to, settings.SustainHalfLife) * factor;
-    cuts.push_back(from);
-    cuts.push_back(to);
+    double const release = std::clamp(note->Release, from, to);
+    events.push_back({from, note->NoteNr, 1, 0});
+    events.push_back({release, note->NoteNr, -1, 1});
+    events.push_back({to, note->NoteNr, 0, -1});
   }
-  std::sort(cuts.begin(), cuts.end());
+  std::sort(events.begin(), events.end(), [](CBassEvent const& a, CBassEvent const& b) { return a.Pos < b.Pos; });
+  int held[128] = {}, sustained[128] = {};
   double sounding = 0;
-  for (std::size_t i = 0; i + 1 < cuts.size(); ++i) {
-    double const a = cuts[i], b = cuts[i + 1];
-    if (b <= a) continue;
-    int const lowest = LowestAt(active, (a + b) / 2);
+  for (std::size_t i = 0; i < events.size();) {
+    double const pos = events[i].Pos;
+    for (; i < events.size() && events[i].Pos == pos; ++i) {
+      held[events[i].NoteNr] += events[i].Held;
+      sustained[events[i].NoteNr] += events[i].Sustained;
+    }
+    if (i == events.size()) break;
+    int lowest = 0;
+    while (lowest < 128 && held[lowest] == 0) ++lowest;
+    if (lowest == 128)
+      for (lowest = 0; lowest < 128 && sustained[lowest] == 0;) ++lowest;
     if (lowest == 128) continue;
-    unit.Bass[lowest % 12] += b - a;
-    sounding += b - a;
+    double const length = events[i].Pos - pos;
+    bass[lowest % 12] += length;
+    sounding += length;
   }
+  return sounding;
+}
+
+// Weight and bass of one unit from the notes sounding in it.
+void Gather(CTimelineUnit& unit, std::vector<CSoundingNote const*> const& active,
+            CChordTimelineSettings const& settings) {
+  double const u0 = double(unit.FirstBeat);
+  double const u1 = double(unit.EndBeat);
+  for (CSoundingNote const* note : active) {
+    double const from = std::max(note->Start, u0), to = std::min(note->End, u1);
+    if (to <= from) continue;
+    double const factor = StartsOffBeatAndShort(*note) ? settings.OffBeatWeight : 1.0;
+    unit.Weight[note->NoteNr % 12] += Sounded(*note, from, to, settings.SustainHalfLife) * factor;
+  }
+  double const sounding = GatherBass(active, u0, u1, unit.Bass);
   double total = 0;
   for (double w : unit.Weight) total += w;
   unit.Silent = !(sounding > 0 && total > 0);
@@ -189,20 +206,43 @@ void Gather(CTimelineUnit& unit, std::vector<CSoundingNote const*> const& active
 
 } // namespace
 
-std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes, double phase,
+std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes, double phase, CMidiTimeMap const& map,
                                          CChordTimelineSettings const& settings) {
+  // On the shifted grid, with onsets just before a beat and ends just after one
+  // moved onto it, so that a note played a little early or held a little long does
+  // not leave a sliver of itself in the beat next to its own.
+  std::vector<CSoundingNote> shifted = notes;
+  for (CSoundingNote& note : shifted) {
+    note.Start -= phase;
+    note.Release -= phase;
+    note.End -= phase;
+    if (note.Start - std::floor(note.Start) > 1 - OnBeatTolerance) note.Start = std::ceil(note.Start);
+    if (note.End - std::floor(note.End) < OnBeatTolerance && std::floor(note.End) > note.Start)
+      note.End = std::floor(note.End);
+    note.Release = std::clamp(note.Release, note.Start, std::max(note.Start, note.End));
+    note.End = std::max(note.End, note.Start);
+  }
+
   // A unit boundary at the beat of every onset and end and the beat after it.
   std::vector<long long> cuts;
-  cuts.reserve(4 * notes.size());
-  for (CSoundingNote const& note : notes) {
-    double const s = std::floor(note.Start - phase), e = note.End - phase;
-    cuts.push_back(static_cast<long long>(s));
-    cuts.push_back(static_cast<long long>(s) + 1);
-    cuts.push_back(static_cast<long long>(std::floor(e)));
-    cuts.push_back(static_cast<long long>(std::ceil(e)));
+  cuts.reserve(5 * shifted.size());
+  for (CSoundingNote const& note : shifted) {
+    auto const s = static_cast<long long>(std::floor(note.Start));
+    cuts.push_back(s);
+    cuts.push_back(s + 1);
+    cuts.push_back(static_cast<long long>(std::floor(note.End)));
+    cuts.push_back(static_cast<long long>(std::ceil(note.End)));
   }
   std::sort(cuts.begin(), cuts.end());
   cuts.erase(std::unique(cuts.begin(), cuts.end()), cuts.end());
+  // A stretch without onsets or ends that spans a bar line is cut there too, so that
+  // the chord may change on the bar line.
+  for (std::size_t i = 0, count = cuts.size(); i + 1 < count; ++i) {
+    CMidiTimeMap::CBarBeat const at = map.BarBeatOf(cuts[i]);
+    long long const barLine = cuts[i] + at.BeatsInBar - at.Beat + 1;
+    if (barLine < cuts[i + 1] && map.BarBeatOf(barLine).Beat == 1) cuts.push_back(barLine);
+  }
+  std::sort(cuts.begin(), cuts.end());
 
   std::vector<CTimelineUnit> units;
   std::vector<CSoundingNote const*> active;
@@ -211,11 +251,11 @@ std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes
     CTimelineUnit unit;
     unit.FirstBeat = cuts[i];
     unit.EndBeat = cuts[i + 1];
-    double const u0 = double(unit.FirstBeat) + phase, u1 = double(unit.EndBeat) + phase;
-    for (; next < notes.size() && notes[next].Start < u1; ++next) active.push_back(&notes[next]);
+    double const u0 = double(unit.FirstBeat), u1 = double(unit.EndBeat);
+    for (; next < shifted.size() && shifted[next].Start < u1; ++next) active.push_back(&shifted[next]);
     active.erase(std::remove_if(active.begin(), active.end(), [&](CSoundingNote const* n) { return n->End <= u0; }),
                  active.end());
-    Gather(unit, active, phase, settings);
+    Gather(unit, active, settings);
     units.push_back(unit);
   }
   return units;

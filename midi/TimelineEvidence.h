@@ -28,10 +28,6 @@ struct CTimelineUnit {
   double Bass[12] = {};
 };
 
-/// Whether a note takes part: not on the drum channel (unless settings include
-/// drums), a note number 0..127, finite times, an end after its start.
-bool TakesPart(CTimedNote const& note, CChordTimelineSettings const& settings);
-
 /// Step 1: the notes that take part, with the pedal applied and overlapping notes
 /// of one pitch merged, ordered by start.
 std::vector<CSoundingNote> SoundingNotes(std::vector<CTimedNote> const& notes, std::vector<CTimedPedal> const& pedals,
@@ -43,6 +39,6 @@ double OnsetPhase(std::vector<CSoundingNote> const& notes);
 /// Steps 3 and 4: the units from the first sounding beat to the last, on the grid
 /// shifted by phase.
 std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes, double phase,
-                                         CChordTimelineSettings const& settings);
+                                         CMidiTimeMap const& map, CChordTimelineSettings const& settings);
 
 #endif

@@ -12,6 +12,16 @@ int const KindIntvls[ChordKindCount][5] = {{0, 4, 7, -1},     {0, 3, 7, -1},    
                                            {0, 5, 7, -1},     {0, 2, 7, -1},     {0, 4, 7, 10, -1}, {0, 4, 7, 11, -1},
                                            {0, 3, 7, 10, -1}, {0, 3, 6, 10, -1}, {0, 3, 6, 9, -1},  {0, 7, -1}};
 
+// Which penalty a kind pays: none for the major and minor triads, SeventhPenalty for
+// the diminished triad and the seventh chords, ColourPenalty for the rest.
+enum TKindFamily { Family_Triad, Family_Tonal, Family_Colour };
+TKindFamily const KindFamily[ChordKindCount] = {Family_Triad,  Family_Triad,  Family_Tonal, Family_Colour,
+                                                Family_Colour, Family_Colour, Family_Tonal, Family_Tonal,
+                                                Family_Tonal,  Family_Tonal,  Family_Tonal, Family_Colour};
+
+// Masses are kept this far from 0 and 1, so that every logarithm is finite.
+constexpr double SmallestMass = 1e-6;
+
 double const Impossible = -std::numeric_limits<double>::infinity();
 
 // How a state was reached at a unit.
@@ -22,22 +32,25 @@ enum TFrom : std::uint8_t { From_Same, From_BestChord, From_NoChord };
 int const* ChordKindIntvls(TChordKind kind) { return KindIntvls[kind]; }
 
 CChordScorer::CChordScorer(CChordTimelineSettings const& s) {
-  double const otherBass = std::max(1.0 - s.RootBassMass - s.InversionBassMass, 1e-6);
+  double const toneMass = Within(s.ChordToneMass, SmallestMass, 1 - SmallestMass);
+  double const rootBass = Within(s.RootBassMass, SmallestMass, 1 - 2 * SmallestMass);
+  double const inversionBass = Within(s.InversionBassMass, SmallestMass, 1 - SmallestMass - rootBass);
+  double const otherBass = std::max(1 - rootBass - inversionBass, SmallestMass);
+  double const bassWeight = Within(s.BassWeight, 0, MostPenalty);
   for (int kind = 0; kind < ChordKindCount; ++kind) {
     bool tone[12] = {};
     int tones = 0;
     for (int const* i = KindIntvls[kind]; *i >= 0; ++i, ++tones) tone[*i] = true;
     for (int i = 0; i < 12; ++i) {
-      Tone_[kind][i] = tone[i] ? std::log(s.ChordToneMass / tones) : std::log((1 - s.ChordToneMass) / (12 - tones));
-      double const bass = i == 0    ? s.RootBassMass
-                          : tone[i] ? s.InversionBassMass / (tones - 1)
-                                    : otherBass / (12 - tones);
-      Bass_[kind][i] = s.BassWeight * std::log(bass);
+      Tone_[kind][i] = std::log(tone[i] ? toneMass / tones : (1 - toneMass) / (12 - tones));
+      double const bass = i == 0 ? rootBass : tone[i] ? inversionBass / (tones - 1) : otherBass / (12 - tones);
+      Bass_[kind][i] = bassWeight * std::log(bass);
     }
-    bool const seventh = kind >= ChordKind_Dom7 && kind <= ChordKind_Dim7;
-    Colour_[kind] = kind == ChordKind_Major || kind == ChordKind_Minor ? 0
-                    : seventh                                          ? s.SeventhPenalty
-                                                                       : s.ColourPenalty;
+    switch (KindFamily[kind]) {
+    case Family_Triad: Colour_[kind] = 0; break;
+    case Family_Tonal: Colour_[kind] = Within(s.SeventhPenalty, 0, MostPenalty); break;
+    case Family_Colour: Colour_[kind] = Within(s.ColourPenalty, 0, MostPenalty); break;
+    }
   }
 }
 

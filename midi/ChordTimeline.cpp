@@ -28,12 +28,13 @@ std::vector<double> ChangeCosts(std::vector<CTimelineUnit> const& units, CMidiTi
   for (CTimelineUnit const& unit : units) {
     int const level = MetricalLevel(map.BarBeatOf(unit.FirstBeat));
     switch (settings.Grid) {
-    case ChordGrid_Beat: costs.push_back(settings.ChangeCost[0]); break;
+    case ChordGrid_Beat: costs.push_back(Within(settings.ChangeCost[0], 0, MostPenalty)); break;
     case ChordGrid_Bar:
-      costs.push_back(level == 0 ? settings.ChangeCost[0] : std::numeric_limits<double>::infinity());
+      costs.push_back(level == 0 ? Within(settings.ChangeCost[0], 0, MostPenalty)
+                                 : std::numeric_limits<double>::infinity());
       break;
     case ChordGrid_Auto:
-    default: costs.push_back(settings.ChangeCost[level]); break;
+    default: costs.push_back(Within(settings.ChangeCost[level], 0, MostPenalty)); break;
     }
   }
   return costs;

@@ -88,7 +88,7 @@ std::vector<CSoundingNote> SoundingNotes(std::vector<CTimedNote> const& notes, s
     double const velocity = std::clamp(note.Velocity, 1, 127);
     double const start = Bounded(map.SecondsToBeatPos(note.Start));
     double const release = Bounded(map.SecondsToBeatPos(note.End));
-    double const tailLimit = release + SustainHalfLives * settings.SustainHalfLife;
+    double const tailLimit = release + SustainHalfLives * Within(settings.SustainHalfLife, 0, MostPenalty);
     double const sustained = std::min(Bounded(map.SecondsToBeatPos(end)), tailLimit);
     sounding.push_back(CSoundingNote{start, release, std::max(release, sustained), note.NoteNr, velocity / 127.0});
   }
@@ -193,8 +193,9 @@ void Gather(CTimelineUnit& unit, std::vector<CSoundingNote const*> const& active
   for (CSoundingNote const* note : active) {
     double const from = std::max(note->Start, u0), to = std::min(note->End, u1);
     if (to <= from) continue;
-    double const factor = StartsOffBeatAndShort(*note) ? settings.OffBeatWeight : 1.0;
-    unit.Weight[note->NoteNr % 12] += Sounded(*note, from, to, settings.SustainHalfLife) * factor;
+    double const factor = StartsOffBeatAndShort(*note) ? Within(settings.OffBeatWeight, 0, 1) : 1.0;
+    unit.Weight[note->NoteNr % 12] +=
+        Sounded(*note, from, to, Within(settings.SustainHalfLife, 0, MostPenalty)) * factor;
   }
   double const sounding = GatherBass(active, u0, u1, unit.Bass);
   double total = 0;

@@ -7,6 +7,12 @@
 
 #include <vector>
 
+/// v within lo..hi; lo for a NaN. Settings pass through it, so that any values a
+/// host sets keep the scores finite and ordered.
+inline double Within(double v, double lo, double hi) { return !(v >= lo) ? lo : !(v <= hi) ? hi : v; }
+/// The largest weight, penalty or cost taken from the settings.
+constexpr double MostPenalty = 1e12;
+
 /// A pitch sounding from Start to End, in beat positions of the unshifted grid: held
 /// until Release, then sustained by the pedal and fading.
 struct CSoundingNote {
@@ -38,7 +44,7 @@ double OnsetPhase(std::vector<CSoundingNote> const& notes);
 
 /// Steps 3 and 4: the units from the first sounding beat to the last, on the grid
 /// shifted by phase.
-std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes, double phase,
-                                         CMidiTimeMap const& map, CChordTimelineSettings const& settings);
+std::vector<CTimelineUnit> TimelineUnits(std::vector<CSoundingNote> const& notes, double phase, CMidiTimeMap const& map,
+                                         CChordTimelineSettings const& settings);
 
 #endif

@@ -5,6 +5,7 @@
 
 #include <tonvex/ChordTimeline.h>
 
+#include <charconv>
 #include <chrono>
 #include <cstdio>
 #include <cstdlib>
@@ -48,7 +49,10 @@ bool Set(CChordTimelineSettings& s, std::string const& assignment) {
   auto eq = assignment.find('=');
   if (eq == std::string::npos) return false;
   std::string const name = assignment.substr(0, eq);
-  double const v = std::atof(assignment.c_str() + eq + 1);
+  double v = 0;
+  char const* const text = assignment.c_str() + eq + 1;
+  char const* const end = assignment.c_str() + assignment.size();
+  if (std::from_chars(text, end, v).ptr != end) return false;
   if (name == "OffBeatWeight")
     s.OffBeatWeight = v;
   else if (name == "ChordToneMass")

@@ -1,12 +1,17 @@
 // The simplest honest chord timeline, to compare the analysis with: per beat of the
-// file's own tempo map, the lowest sounding note is the root, and the chord is minor
-// if the minor third above it sounds longer than the major third, else major; a beat
-// in which nothing sounds is N. Drums (channel 10) are left out, the sustain pedal
+// file's own tempo map, the lowest sounding note (the pitch class that is lowest for
+// the longest time in the beat) is the root, and the chord is minor if the minor third
+// above it sounds longer than the major third, else major; a beat in which nothing
+// sounds is N. Drums (channel 10) are left out, the sustain pedal
 // is ignored. Writes OUT_DIR/NAME.lab per file NAME.mid (start, end, Harte label).
-// usage: tonvex_baseline_chords OUT_DIR FILE.mid...
+// With --align the beats are shifted to where the onsets cluster, as the chord
+// timeline shifts them (ChordTimeline.h, step 2), to show what that alone is worth.
+// usage: tonvex_baseline_chords [--align] OUT_DIR FILE.mid...
 #include "MidiBytesFile.h"
 
 #include <tonvex/ChordTimeline.h>
+
+#include "midi/TimelineEvidence.h"
 
 #include <algorithm>
 #include <cmath>
@@ -17,12 +22,30 @@ namespace {
 
 const char* const RootNames[] = {"C", "C#", "D", "Eb", "E", "F", "F#", "G", "Ab", "A", "Bb", "B"};
 
+// The pitch class that is the lowest sounding note for the longest time in
+// [from, to), or -1 when nothing sounds.
+int LongestLowest(std::vector<CTimedNote> const& notes, double from, double to) {
+  std::vector<double> cuts = {from, to};
+  for (CTimedNote const& n : notes) {
+    if (n.Start > from && n.Start < to) cuts.push_back(n.Start);
+    if (n.End > from && n.End < to) cuts.push_back(n.End);
+  }
+  std::sort(cuts.begin(), cuts.end());
+  double lowestFor[12] = {};
+  for (std::size_t i = 0; i + 1 < cuts.size(); ++i) {
+    double const mid = (cuts[i] + cuts[i + 1]) / 2;
+    int lowest = 128;
+    for (CTimedNote const& n : notes)
+      if (n.Start <= mid && mid < n.End) lowest = std::min(lowest, n.NoteNr);
+    if (lowest < 128) lowestFor[lowest % 12] += cuts[i + 1] - cuts[i];
+  }
+  int const best = static_cast<int>(std::max_element(lowestFor, lowestFor + 12) - lowestFor);
+  return lowestFor[best] > 0 ? best : -1;
+}
+
 std::string BeatLabel(std::vector<CTimedNote> const& notes, double from, double to) {
-  int lowest = 128;
-  for (CTimedNote const& n : notes)
-    if (n.Start < to && n.End > from) lowest = std::min(lowest, n.NoteNr);
-  if (lowest == 128) return "N";
-  int const root = lowest % 12;
+  int const root = LongestLowest(notes, from, to);
+  if (root < 0) return "N";
   double third[2] = {0, 0}; // minor, major
   for (CTimedNote const& n : notes) {
     int const intvl = (n.NoteNr % 12 - root + 12) % 12;
@@ -32,7 +55,7 @@ std::string BeatLabel(std::vector<CTimedNote> const& notes, double from, double 
   return std::string(RootNames[root]) + (third[0] > third[1] ? ":min" : ":maj");
 }
 
-bool WriteLab(CMidiFile const& file, std::string const& path) {
+bool WriteLab(CMidiFile const& file, std::string const& path, bool align) {
   CMidiTimeMap const map(file);
   std::vector<CTimedNote> notes;
   double end = 0;
@@ -41,6 +64,7 @@ bool WriteLab(CMidiFile const& file, std::string const& path) {
       notes.push_back(n);
       end = std::max(end, n.End);
     }
+  double const phase = align ? OnsetPhase(SoundingNotes(notes, {}, map, CChordTimelineSettings())) : 0.0;
   FILE* out = std::fopen(path.c_str(), "w");
   if (out == nullptr) return false;
   std::string label;
@@ -49,7 +73,9 @@ bool WriteLab(CMidiFile const& file, std::string const& path) {
   std::sort(notes.begin(), notes.end(), [](CTimedNote const& a, CTimedNote const& b) { return a.Start < b.Start; });
   std::vector<CTimedNote> sounding;
   for (long long beat = 0; end > 0; ++beat) {
-    double const from = map.BeatPosToSeconds(double(beat)), to = std::min(map.BeatPosToSeconds(double(beat + 1)), end);
+    double const from = std::max(0.0, map.BeatPosToSeconds(double(beat - 1) + phase));
+    double const to = std::min(map.BeatPosToSeconds(double(beat) + phase), end);
+    if (!(to > from)) continue;
     for (; first < notes.size() && notes[first].Start < to; ++first) sounding.push_back(notes[first]);
     sounding.erase(std::remove_if(sounding.begin(), sounding.end(), [&](CTimedNote const& n) { return n.End <= from; }),
                    sounding.end());
@@ -68,26 +94,28 @@ bool WriteLab(CMidiFile const& file, std::string const& path) {
 } // namespace
 
 int main(int argc, char** argv) {
-  if (argc < 3) {
-    std::fputs("usage: tonvex_baseline_chords OUT_DIR FILE.mid...\n", stderr);
+  bool const align = argc > 1 && std::string(argv[1]) == "--align";
+  int const first = align ? 2 : 1;
+  if (argc < first + 2) {
+    std::fputs("usage: tonvex_baseline_chords [--align] OUT_DIR FILE.mid...\n", stderr);
     return 2;
   }
   int status = 0;
-  for (int a = 2; a < argc; ++a) {
+  for (int a = first + 1; a < argc; ++a) {
     std::string const path = argv[a];
     std::vector<unsigned char> bytes;
     CMidiFile file;
-    CMidiReadResult result;
+    std::string problem;
     if (!ReadBytes(path, bytes))
-      result.What = "cannot read the file";
+      problem = "cannot read the file";
     else
-      result = ReadMidiFile(bytes.data(), bytes.size(), file);
+      problem = ReadMidiFile(bytes.data(), bytes.size(), file).Message();
     std::string name = path.substr(path.find_last_of('/') + 1);
     name = name.substr(0, name.find_last_of('.'));
-    if (result.Ok() && !WriteLab(file, std::string(argv[1]) + "/" + name + ".lab"))
-      result.What = "cannot write " + name + ".lab";
-    if (!result.Ok()) {
-      std::fprintf(stderr, "tonvex_baseline_chords: %s: %s\n", path.c_str(), result.What.c_str());
+    if (problem.empty() && !WriteLab(file, std::string(argv[first]) + "/" + name + ".lab", align))
+      problem = "cannot write " + name + ".lab";
+    if (!problem.empty()) {
+      std::fprintf(stderr, "tonvex_baseline_chords: %s: %s\n", path.c_str(), problem.c_str());
       status = 1;
     }
   }

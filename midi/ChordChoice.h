@@ -7,6 +7,23 @@
 
 #include <vector>
 
+/// The kinds of chord the analysis chooses from, by their intervals above the root.
+enum TChordKind : int {
+  ChordKind_Major = 0,
+  ChordKind_Minor,
+  ChordKind_Dim,
+  ChordKind_Aug,
+  ChordKind_Sus4,
+  ChordKind_Sus2,
+  ChordKind_Dom7,
+  ChordKind_Maj7,
+  ChordKind_Min7,
+  ChordKind_HalfDim7,
+  ChordKind_Dim7,
+  ChordKind_Power
+};
+constexpr int ChordKindCount = 12;
+
 /// A candidate chord: root pitch class and kind. State NoChordState is no chord.
 constexpr int ChordStateCount = 12 * ChordKindCount;
 constexpr int NoChordState = ChordStateCount;

@@ -199,7 +199,6 @@ std::vector<CChordSegment> AnalyseChordTimeline(std::vector<CTimedNote> const& n
     if (!noChord) {
       double weight[12], bass[12];
       RunEvidence(units, *run, weight, bass);
-      segment.Kind = StateKind(run->State);
       segment.Chord = RunChord(run->State, bass, settings.Algo);
     }
     segments.push_back(segment);

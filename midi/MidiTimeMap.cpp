@@ -111,7 +111,10 @@ double CMidiTimeMap::SecondsToBeatPos(double seconds) const {
 
 double CMidiTimeMap::BeatPosToSeconds(double beatPos) const {
   CMeterPiece const& piece = PieceAt(Meter_, beatPos, [](CMeterPiece const& p) { return double(p.BeatIx); });
-  return QuartersToSeconds(piece.Quarters + (beatPos - double(piece.BeatIx)) * piece.QuartersPerBeat);
+  double quarters = piece.Quarters + (beatPos - double(piece.BeatIx)) * piece.QuartersPerBeat;
+  // A beat cut short by the next time signature ends where that begins.
+  if (&piece != &Meter_.back()) quarters = std::min(quarters, (&piece + 1)->Quarters);
+  return QuartersToSeconds(quarters);
 }
 
 CMidiTimeMap::CBarBeat CMidiTimeMap::BarBeatOf(long long beatIx) const {

@@ -138,7 +138,10 @@ TONVEX_API CMidiReadResult ReadMidiFile(unsigned char const* data, std::size_t s
 /// line anyway). Its beat is the note of its denominator, and in compound meters
 /// (6, 9, 12, ... over 8 or shorter notes) three of them: 6/8 has two dotted-quarter
 /// beats. Beat positions are counted from the start of the file, one per beat, so a
-/// position 12.5 lies halfway through the thirteenth beat.
+/// position 12.5 lies halfway through the thirteenth beat. A beat that a time
+/// signature cuts short ends where the time signature stands: the positions of its
+/// missing part all give that time, so time and beat position never run against
+/// each other.
 class TONVEX_API CMidiTimeMap {
 public:
   /// 480 ticks per quarter, 120 beats per minute, 4/4.

@@ -190,6 +190,14 @@ TEST(MidiTimeMapTest, BarsAndBeatsAcrossMeterChanges) {
     EXPECT_DOUBLE_EQ(map.BeatPosToSeconds(double(b.beatIx)), b.seconds) << b.beatIx;
     EXPECT_DOUBLE_EQ(map.SecondsToBeatPos(b.seconds), double(b.beatIx)) << b.beatIx;
   }
+  // The rest of the beat the 3/4 cuts short (positions 8.5 to 9) gives its start.
+  double last = map.BeatPosToSeconds(-1);
+  for (double pos = -1; pos < 15; pos += 1.0 / 16) {
+    double const seconds = map.BeatPosToSeconds(pos);
+    EXPECT_GE(seconds, last) << pos;
+    last = seconds;
+  }
+  EXPECT_DOUBLE_EQ(map.BeatPosToSeconds(8.75), 5.375);
 }
 
 } // namespace

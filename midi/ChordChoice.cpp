@@ -19,6 +19,9 @@ TKindFamily const KindFamily[ChordKindCount] = {Family_Triad,  Family_Triad,  Fa
                                                 Family_Colour, Family_Colour, Family_Tonal, Family_Tonal,
                                                 Family_Tonal,  Family_Tonal,  Family_Tonal, Family_Colour};
 
+// A chord tone with less than this share of a unit's evidence counts as missing.
+constexpr double MissingToneShare = 0.05;
+
 // Masses are kept this far from 0 and 1, so that every logarithm is finite.
 constexpr double SmallestMass = 1e-6;
 
@@ -37,6 +40,7 @@ CChordScorer::CChordScorer(CChordTimelineSettings const& s) {
   double const inversionBass = Within(s.InversionBassMass, SmallestMass, 1 - SmallestMass - rootBass);
   double const otherBass = std::max(1 - rootBass - inversionBass, SmallestMass);
   double const bassWeight = Within(s.BassWeight, 0, MostPenalty);
+  Missing_ = Within(s.MissingTonePenalty, 0, MostPenalty);
   for (int kind = 0; kind < ChordKindCount; ++kind) {
     bool tone[12] = {};
     int tones = 0;
@@ -60,6 +64,8 @@ void CChordScorer::Score(double const weight[12], double const bass[12], double 
   for (int root = 0; root < 12; ++root)
     for (int kind = 0; kind < ChordKindCount; ++kind) {
       double score = -Colour_[kind] * length;
+      for (int const* t = KindIntvls[kind]; *t >= 0; ++t)
+        if (weight[(root + *t) % 12] < MissingToneShare * length) score -= Missing_ * length;
       for (int pc = 0; pc < 12; ++pc) {
         int const i = (pc - root + 12) % 12;
         score += weight[pc] * Tone_[kind][i] + bass[pc] * Bass_[kind][i];

@@ -45,6 +45,7 @@ private:
   double Tone_[ChordKindCount][12];
   double Bass_[ChordKindCount][12];
   double Colour_[ChordKindCount];
+  double Missing_;
 };
 
 /// The best state per unit: NoChordState exactly for the silent units. changeCost[u]

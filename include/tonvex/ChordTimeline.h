@@ -36,10 +36,12 @@
 //     over a unit is a log-likelihood: chord tones share ChordToneMass of the
 //     pitch-class evidence and the other pitch classes the rest, equally; the bass,
 //     weighted by BassWeight, is the root with RootBassMass, another chord tone with
-//     InversionBassMass, anything else with what is left. The diminished triad and
-//     the seventh chords pay SeventhPenalty per beat, the augmented, sus and power
-//     chords ColourPenalty, so that a melody note does not turn a triad into a
-//     seventh or sus chord unless it is held as part of the harmony.
+//     InversionBassMass, anything else with what is left. Each chord tone that has
+//     less than 5% of the evidence costs MissingTonePenalty per beat (C major is a
+//     poor reading of F, A and C over a held C). The diminished triad and the seventh
+//     chords pay SeventhPenalty per beat, the augmented, sus and power chords
+//     ColourPenalty, so that a melody note does not turn a triad into a seventh or
+//     sus chord unless it is held as part of the harmony.
 //  6. Dynamic programming (Viterbi) over the units finds the chord sequence with the
 //     best total score, where a change of chord costs ChangeCost[level] by the
 //     metrical level of the beat it falls on: the first beat of a bar (level 0), the
@@ -107,15 +109,16 @@ struct CChordTimelineSettings {
   // costs in the same unit per beat of evidence. Values out of range are taken as
   // the nearest sensible one (masses within 0..1, weights and costs not negative).
   static constexpr int PhaseBins = 48;
-  double OffBeatWeight = 0.5;   // short notes starting off the beat
+  double OffBeatWeight = 1.0;   // short notes starting off the beat
   double SustainHalfLife = 0.5; // beats
   double ChordToneMass = 0.9;
   double BassWeight = 0.5;
   double RootBassMass = 0.6;
   double InversionBassMass = 0.3;
-  double ColourPenalty = 1.0;             // augmented, sus4, sus2, power chord
-  double SeventhPenalty = 0.3;            // diminished triad and the seventh chords
-  double ChangeCost[3] = {1.0, 1.5, 2.5}; // bar line, middle of the bar, other beats
+  double MissingTonePenalty = 0.25;
+  double ColourPenalty = 1.0;               // augmented, sus4, sus2, power chord
+  double SeventhPenalty = 0.3;              // diminished triad and the seventh chords
+  double ChangeCost[3] = {0.75, 1.0, 1.25}; // bar line, middle of the bar, other beats
 };
 
 /// One segment of the timeline.

@@ -70,13 +70,16 @@ TEST(ChordTimelineTest, BlockChordsWithAndWithoutMelody) {
   EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(CAmFG), Melody()})), CAmFGTimeline);
 }
 
-// Broken chords, one note per eighth: C, F over C, G7 over B, C.
+// Broken chords, one note per eighth over a bass held through the bar: C, F over C,
+// G7 (B F D F over G), C.
 TEST(ChordTimelineTest, Arpeggios) {
-  int const patterns[][4] = {{48, 64, 67, 72}, {48, 65, 69, 72}, {47, 65, 67, 74}, {48, 64, 67, 72}};
-  MidiTrackBytes track;
-  for (auto const& p : patterns)
-    for (int i = 0; i < 8; ++i) track.On(0, p[i % 4], 80).Off(Beat / 2, p[i % 4]);
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), track.End()})),
+  int const patterns[][5] = {{36, 60, 64, 67, 72}, {36, 60, 65, 69, 72}, {43, 59, 65, 62, 65}, {36, 60, 64, 67, 72}};
+  MidiTrackBytes bass, broken;
+  for (auto const& p : patterns) {
+    bass.On(0, p[0], 80).Off(Bar, p[0]);
+    for (int i = 0; i < 8; ++i) broken.On(0, p[1 + i % 4], 70, 1).Off(Beat / 2, p[1 + i % 4], 1);
+  }
+  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), bass.End(), broken.End()})),
             "0.00-2.00 C  @1:1|2.00-4.00 F  @2:1|4.00-6.00 G  7@3:1|6.00-8.00 C  @4:1|");
 }
 

@@ -69,6 +69,8 @@ bool Set(CChordTimelineSettings& s, std::string const& assignment) {
     s.SustainHalfLife = v;
   else if (name == "SeventhPenalty")
     s.SeventhPenalty = v;
+  else if (name == "MissingTonePenalty")
+    s.MissingTonePenalty = v;
   else if (name == "Change0")
     s.ChangeCost[0] = v;
   else if (name == "Change1")

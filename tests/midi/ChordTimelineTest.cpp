@@ -70,6 +70,16 @@ TEST(ChordTimelineTest, BlockChordsWithAndWithoutMelody) {
   EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(CAmFG), Melody()})), CAmFGTimeline);
 }
 
+// A chorale in four voices, a chord on every beat: I IV V I | vi ii V7 I.
+TEST(ChordTimelineTest, ChordOnEveryBeat) {
+  std::vector<std::vector<int>> const chorale = {{48, 64, 67, 72}, {41, 65, 69, 72}, {43, 62, 67, 71},
+                                                 {48, 64, 67, 72}, {45, 64, 69, 72}, {38, 65, 69, 74},
+                                                 {43, 65, 67, 71}, {36, 64, 67, 72}};
+  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(chorale, Beat)})),
+            "0.00-0.50 C  @1:1|0.50-1.00 F  @1:2|1.00-1.50 G  @1:3|1.50-2.00 C  @1:4|2.00-2.50 A m @2:1|"
+            "2.50-3.00 D m @2:2|3.00-3.50 G  7@2:3|3.50-4.00 C  @2:4|");
+}
+
 // Broken chords, one note per eighth over a bass held through the bar: C, F over C,
 // G7 (B F D F over G), C.
 TEST(ChordTimelineTest, Arpeggios) {

@@ -5,8 +5,8 @@
 
 #include "Chord.h"
 #include "ChordAnalysisNet.h"
-#include "ChordTypes.h"
 #include "ChordTimeline.h"
+#include "ChordTypes.h"
 #include "ChordnamePref.h"
 #include "IntvlSet.h"
 #include "MidiFile.h"

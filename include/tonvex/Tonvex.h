@@ -5,9 +5,11 @@
 
 #include "Chord.h"
 #include "ChordAnalysisNet.h"
+#include "ChordTimeline.h"
 #include "ChordTypes.h"
 #include "ChordnamePref.h"
 #include "IntvlSet.h"
+#include "MidiFile.h"
 #include "MySet.h"
 #include "NetProperties.h"
 #include "Neuron.h"

@@ -9,90 +9,82 @@
 
 namespace {
 
-constexpr CSymbolTone Root{0, 1, Role_Root};
-constexpr CSymbolTone Maj3{4, 3, Role_Third}, Min3{3, 3, Role_Third};
-constexpr CSymbolTone Sus4{5, 4, Role_Third}, Sus2{2, 2, Role_Third};
-constexpr CSymbolTone P5{7, 5, Role_Fifth}, Dim5{6, 5, Role_Fifth}, Aug5{8, 5, Role_Fifth};
-constexpr CSymbolTone Six{9, 6, Role_Sixth};
-constexpr CSymbolTone Min7{10, 7, Role_Seventh}, Maj7{11, 7, Role_Seventh}, Dim7{9, 7, Role_Seventh};
-constexpr CSymbolTone Nine{2, 9, Role_Ninth}, Eleven{5, 11, Role_Eleventh}, Thirteen{9, 13, Role_Thirteenth};
-
 // The vocabulary in order of preference: of two types that describe a set with as
 // few changes, the earlier is written.
 constexpr CSymbolType Types[] = {
-    {"", nullptr, 0, {Root, Maj3, P5}},
-    {"m", nullptr, 0, {Root, Min3, P5}},
-    {"7", nullptr, 0, {Root, Maj3, P5, Min7}},
+    {"", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5}},
+    {"m", nullptr, 0, {ToneRoot, ToneMin3, ToneP5}},
+    {"7", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneMin7}},
     {"maj7",
      "\xCE\x94"
      "7",
      Sym_Triangle,
-     {Root, Maj3, P5, Maj7}},
-    {"m7", nullptr, 0, {Root, Min3, P5, Min7}},
-    {"6", nullptr, 0, {Root, Maj3, P5, Six}},
-    {"m6", nullptr, 0, {Root, Min3, P5, Six}},
+     {ToneRoot, ToneMaj3, ToneP5, ToneMaj7}},
+    {"m7", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneMin7}},
+    {"6", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneSix}},
+    {"m6", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneSix}},
     {"m(maj7)",
      "m\xCE\x94"
      "7",
      Sym_Triangle,
-     {Root, Min3, P5, Maj7}},
-    {"dim", "o", Sym_DimSign, {Root, Min3, Dim5}},
-    {"dim7", "o7", Sym_DimSign, {Root, Min3, Dim5, Dim7}},
+     {ToneRoot, ToneMin3, ToneP5, ToneMaj7}},
+    {"dim", "o", Sym_DimSign, {ToneRoot, ToneMin3, ToneDim5}},
+    {"dim7", "o7", Sym_DimSign, {ToneRoot, ToneMin3, ToneDim5, ToneDim7}},
     {"m7b5",
      "\xC3\xB8"
      "7",
      Sym_HalfDimSign,
-     {Root, Min3, Dim5, Min7}},
-    {"aug", "+", Sym_PlusSign, {Root, Maj3, Aug5}},
-    {"sus4", nullptr, 0, {Root, Sus4, P5}},
-    {"sus2", nullptr, 0, {Root, Sus2, P5}},
-    {"7sus4", nullptr, 0, {Root, Sus4, P5, Min7}},
-    {"5", nullptr, 0, {Root, P5}},
-    {"9", nullptr, 0, {Root, Maj3, P5, Min7, Nine}},
+     {ToneRoot, ToneMin3, ToneDim5, ToneMin7}},
+    {"aug", "+", Sym_PlusSign, {ToneRoot, ToneMaj3, ToneAug5}},
+    {"sus4", nullptr, 0, {ToneRoot, ToneSus4, ToneP5}},
+    {"sus2", nullptr, 0, {ToneRoot, ToneSus2, ToneP5}},
+    {"7sus4", nullptr, 0, {ToneRoot, ToneSus4, ToneP5, ToneMin7}},
+    {"5", nullptr, 0, {ToneRoot, ToneP5}},
+    {"9", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneMin7, ToneNine}},
     {"maj9",
      "\xCE\x94"
      "9",
      Sym_Triangle,
-     {Root, Maj3, P5, Maj7, Nine}},
-    {"m9", nullptr, 0, {Root, Min3, P5, Min7, Nine}},
-    {"6/9", nullptr, 0, {Root, Maj3, P5, Six, Nine}},
-    {"m6/9", nullptr, 0, {Root, Min3, P5, Six, Nine}},
+     {ToneRoot, ToneMaj3, ToneP5, ToneMaj7, ToneNine}},
+    {"m9", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneMin7, ToneNine}},
+    {"6/9", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneSix, ToneNine}},
+    {"m6/9", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneSix, ToneNine}},
     {"m(maj9)",
      "m\xCE\x94"
      "9",
      Sym_Triangle,
-     {Root, Min3, P5, Maj7, Nine}},
-    {"11", nullptr, 0, {Root, Maj3, P5, Min7, Nine, Eleven}},
-    {"m11", nullptr, 0, {Root, Min3, P5, Min7, Nine, Eleven}},
-    {"13", nullptr, 0, {Root, Maj3, P5, Min7, Nine, Thirteen}},
+     {ToneRoot, ToneMin3, ToneP5, ToneMaj7, ToneNine}},
+    {"11", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneMin7, ToneNine, ToneEleven}},
+    {"m11", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneMin7, ToneNine, ToneEleven}},
+    {"13", nullptr, 0, {ToneRoot, ToneMaj3, ToneP5, ToneMin7, ToneNine, ToneThirteen}},
     {"maj13",
      "\xCE\x94"
      "13",
      Sym_Triangle,
-     {Root, Maj3, P5, Maj7, Nine, Thirteen}},
-    {"m13", nullptr, 0, {Root, Min3, P5, Min7, Nine, Thirteen}},
-    {"9sus4", nullptr, 0, {Root, Sus4, P5, Min7, Nine}},
-    {"13sus4", nullptr, 0, {Root, Sus4, P5, Min7, Nine, Thirteen}},
-    {"7sus2", nullptr, 0, {Root, Sus2, P5, Min7}},
+     {ToneRoot, ToneMaj3, ToneP5, ToneMaj7, ToneNine, ToneThirteen}},
+    {"m13", nullptr, 0, {ToneRoot, ToneMin3, ToneP5, ToneMin7, ToneNine, ToneThirteen}},
+    {"9sus4", nullptr, 0, {ToneRoot, ToneSus4, ToneP5, ToneMin7, ToneNine}},
+    {"13sus4", nullptr, 0, {ToneRoot, ToneSus4, ToneP5, ToneMin7, ToneNine, ToneThirteen}},
+    {"7sus2", nullptr, 0, {ToneRoot, ToneSus2, ToneP5, ToneMin7}},
     {"maj7sus4",
      "\xCE\x94"
      "7sus4",
      Sym_Triangle,
-     {Root, Sus4, P5, Maj7}},
+     {ToneRoot, ToneSus4, ToneP5, ToneMaj7}},
     {"maj7sus2",
      "\xCE\x94"
      "7sus2",
      Sym_Triangle,
-     {Root, Sus2, P5, Maj7}},
+     {ToneRoot, ToneSus2, ToneP5, ToneMaj7}},
 };
 
 // The dominant seventh with both altered fifths and ninths, written "7alt" only
 // under Sym_Alt and only for exactly these tones.
-constexpr CSymbolType AltType = {
-    "7alt",
-    nullptr,
-    0,
-    {Root, Maj3, {6, 5, Role_Fifth}, {8, 5, Role_Fifth}, Min7, {1, 9, Role_Ninth}, {3, 9, Role_Ninth}}};
+constexpr CSymbolType AltType = {"7alt",
+                                 nullptr,
+                                 0,
+                                 {ToneRoot, ToneMaj3, SymbolAlterations[0].Altered, SymbolAlterations[1].Altered,
+                                  ToneMin7, SymbolAlterations[2].Altered, SymbolAlterations[3].Altered}};
 
 constexpr unsigned Bit(int intvl) { return 1u << intvl; }
 
@@ -119,25 +111,11 @@ bool MayOmit(CSymbolType const& type, CSymbolTone tone) {
 // The altered tones that may stand for the natural tone of a role: b5 and #5 for the
 // perfect fifth of a chord with a third, b9 and #9, #11, b13.
 int Alterations(CSymbolType const& type, CSymbolTone tone, CSymbolTone out[2]) {
-  if (tone == P5 && HasRole(type, Role_Third)) {
-    out[0] = {6, 5, Role_Fifth};
-    out[1] = {8, 5, Role_Fifth};
-    return 2;
-  }
-  if (tone == Nine) {
-    out[0] = {1, 9, Role_Ninth};
-    out[1] = {3, 9, Role_Ninth};
-    return 2;
-  }
-  if (tone == Eleven) {
-    out[0] = {6, 11, Role_Eleventh};
-    return 1;
-  }
-  if (tone == Thirteen) {
-    out[0] = {8, 13, Role_Thirteenth};
-    return 1;
-  }
-  return 0;
+  int count = 0;
+  if (tone == ToneP5 && !HasRole(type, Role_Third)) return 0;
+  for (CSymbolAlteration const& alteration : SymbolAlterations)
+    if (alteration.Natural == tone) out[count++] = alteration.Altered;
+  return count;
 }
 
 // The degree of an interval that the type does not hold: the tensions of a seventh
@@ -146,14 +124,14 @@ int Alterations(CSymbolType const& type, CSymbolTone tone, CSymbolTone out[2]) {
 CSymbolTone ExtraTone(CSymbolType const& type, int intvl) {
   bool const seventh = HasRole(type, Role_Seventh);
   switch (intvl) {
-  case 1: return {1, 9, Role_Ninth};
+  case 1: return SymbolAlterations[2].Altered; // b9
   case 2: return {2, 9, Role_Added};
-  case 3: return MaskOf(type) & Bit(4) ? CSymbolTone{3, 9, Role_Ninth} : CSymbolTone{3, 3, Role_Added};
+  case 3: return MaskOf(type) & Bit(4) ? SymbolAlterations[3].Altered : CSymbolTone{3, 3, Role_Added}; // #9
   case 4: return {4, 3, Role_Added};
   case 5: return {5, 11, Role_Added};
-  case 6: return {6, 11, Role_Eleventh};
+  case 6: return SymbolAlterations[4].Altered; // #11
   case 7: return {7, 5, Role_Added};
-  case 8: return seventh ? CSymbolTone{8, 13, Role_Thirteenth} : CSymbolTone{8, 6, Role_Added};
+  case 8: return seventh ? SymbolAlterations[5].Altered : CSymbolTone{8, 6, Role_Added}; // b13
   case 9: return {9, seventh ? 13 : 6, Role_Added};
   case 10: return {10, 7, Role_Added};
   case 11: return {11, 7, Role_Added};

@@ -35,6 +35,27 @@ inline bool operator==(CSymbolTone a, CSymbolTone b) {
   return a.Intvl == b.Intvl && a.Degree == b.Degree && a.Role == b.Role;
 }
 
+// The tones of the vocabulary's chord types.
+constexpr CSymbolTone ToneRoot{0, 1, Role_Root};
+constexpr CSymbolTone ToneMaj3{4, 3, Role_Third}, ToneMin3{3, 3, Role_Third};
+constexpr CSymbolTone ToneSus4{5, 4, Role_Third}, ToneSus2{2, 2, Role_Third};
+constexpr CSymbolTone ToneP5{7, 5, Role_Fifth}, ToneDim5{6, 5, Role_Fifth}, ToneAug5{8, 5, Role_Fifth};
+constexpr CSymbolTone ToneSix{9, 6, Role_Sixth};
+constexpr CSymbolTone ToneMin7{10, 7, Role_Seventh}, ToneMaj7{11, 7, Role_Seventh}, ToneDim7{9, 7, Role_Seventh};
+constexpr CSymbolTone ToneNine{2, 9, Role_Ninth}, ToneEleven{5, 11, Role_Eleventh};
+constexpr CSymbolTone ToneThirteen{9, 13, Role_Thirteenth};
+
+/// An alteration of a degree: the altered tone replaces the natural one.
+struct CSymbolAlteration {
+  CSymbolTone Natural;
+  CSymbolTone Altered;
+};
+
+/// The six alterations: b5, #5, b9, #9, #11, b13 ("alt" is the first four).
+constexpr CSymbolAlteration SymbolAlterations[6] = {
+    {ToneP5, {6, 5, Role_Fifth}},   {ToneP5, {8, 5, Role_Fifth}},         {ToneNine, {1, 9, Role_Ninth}},
+    {ToneNine, {3, 9, Role_Ninth}}, {ToneEleven, {6, 11, Role_Eleventh}}, {ToneThirteen, {8, 13, Role_Thirteenth}}};
+
 /// Semitones of the natural degree 1..13 above the root, folded into 0..11.
 int DegreeIntvl(int degree);
 /// The accidentals of a degree that names an interval: intvl - DegreeIntvl(degree),

@@ -51,7 +51,9 @@
 #include "Chord.h"
 #include "TonvexExport.h"
 
+#include <cstddef>
 #include <string>
+#include <string_view>
 
 /// Style flags of LeadSheetSymbol; 0 is plain ASCII ("#", "b", "maj7", "m7b5", "dim",
 /// "aug"). Combine them with |.
@@ -77,7 +79,7 @@ enum TSymbolStyle : int {
 /// slash whenever its pitch class is not the root's, however narrow the voicing. A
 /// bass that is only an added tone stands after the slash alone ("C/D", not
 /// "Cadd9/D"). A chord without notes or with an undefined root is "N.C.". The result
-/// names the same root, pitch classes and bass.
+/// reads back (ReadChordSymbol) to the same root, pitch classes and bass.
 TONVEX_API std::string LeadSheetSymbol(CChord const& chord, int style = 0);
 
 /// The Harte label of the chord: "C:maj", "A:min7", "C:maj/3", "C:7/b7",
@@ -85,5 +87,35 @@ TONVEX_API std::string LeadSheetSymbol(CChord const& chord, int style = 0);
 /// undefined root. It names exactly the chord's pitch classes and bass, the degrees
 /// spelled as the lead-sheet symbol names them.
 TONVEX_API std::string HarteLabel(CChord const& chord);
+
+/// Where and why ReadChordSymbol stopped.
+struct CChordSymbolProblem {
+  /// Byte offset of the first character that could not be read.
+  std::size_t Offset = 0;
+  /// The text from there on, as it was given.
+  std::string Part;
+  /// What was wrong there: "not a note name", "unexpected text", ...
+  std::string Reason;
+};
+
+/// Reads a lead-sheet symbol or a Harte label into the chord (a text whose root is
+/// followed by ":" is read as a Harte label; "N", "NC" and "N.C." are no chord and
+/// make the chord undefined). Blanks may stand around the text and between its parts
+/// ("C7 (b9, #11)"); words are read in any case ("MAJ7", "Sus4"), the single letters
+/// by case ("m" minor, "M" major); the signs ♯ ♭ 𝄪 𝄫 Δ ø Ø ° are read as well as
+/// # b x, "o" and "+"/"-" before a degree.
+///
+/// The chord gets its notes in this voicing: the bass at note number 48 + its pitch
+/// class, the other degrees up to the 7th within the octave above it, the 9th, 11th
+/// and 13th (and additions written as those) an octave higher. Without a slash the
+/// root is the bass, or the chord's lowest degree when the root is left out. Each
+/// note is spelled by its degree above the root as the symbol names it (C7#9 holds
+/// D#, C7b13 Ab, F#m7b5 C), or by its usual spelling where that would need more than
+/// two accidentals; a bass given as a note keeps its spelling as written. The root is
+/// set (specified) at its key number 0..11 with its spelling as written.
+///
+/// Returns false and leaves the chord unchanged when the text cannot be read; the
+/// problem, when given, then says where and why.
+TONVEX_API bool ReadChordSymbol(std::string_view text, CChord& chord, CChordSymbolProblem* problem = nullptr);
 
 #endif

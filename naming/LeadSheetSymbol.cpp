@@ -26,7 +26,7 @@ void AddTypeText(CSymbolText& text, CSymbolType const& type, int style) {
 // An extra tone: an alteration where the chord has a seventh and not the tone's
 // role ("C7b9", "C7#11"), else an addition ("Cadd9", "Caddb9", "C7add13").
 void AddExtra(CSymbolText& text, CSymbolBody const& body, CSymbolTone tone, bool unicode) {
-  if (!(body.HasSeventh() && tone.Role != Role_Added && !body.TypeHasRole(tone.Role))) {
+  if (!body.WritesAsAlteration(tone)) {
     text.Add("add");
     if (tone.Degree == 7 && tone.Intvl == 11) return text.Add("maj7");
   }

@@ -180,19 +180,21 @@ bool BodyOnType(CSymbolType const& type, unsigned intvls, CSymbolBody& body) {
   return true;
 }
 
-// The number of written changes. An added major third counts three: a chord with
-// both thirds is read as a major chord with a #9 (C7#9, not Cm7add3).
+// The written changes: an alteration or omission counts 2, an addition 3 (Cm9b5
+// rather than Cm7b5add9), an added major third 9 (a chord with both thirds is a
+// major chord with a #9: C7#9, not Cm7add3).
 int Cost(CSymbolBody const& body) {
-  int cost = body.AlteredCount + static_cast<int>(std::bitset<16>(body.Omitted).count());
-  for (int i = 0; i < body.ExtraCount; ++i) cost += body.Extra[i].Intvl == 4 ? 3 : 1;
+  int cost = 2 * (body.AlteredCount + static_cast<int>(std::bitset<16>(body.Omitted).count()));
+  for (int i = 0; i < body.ExtraCount; ++i)
+    cost += body.Extra[i].Intvl == 4 ? 9 : body.WritesAsAlteration(body.Extra[i]) ? 2 : 3;
   return cost;
 }
 
 } // namespace
 
-bool CSymbolBody::HasSeventh() const { return HasRole(*Type, Role_Seventh); }
-
-bool CSymbolBody::TypeHasRole(int role) const { return HasRole(*Type, role); }
+bool CSymbolBody::WritesAsAlteration(CSymbolTone extra) const {
+  return HasRole(*Type, Role_Seventh) && extra.Role != Role_Added && !HasRole(*Type, extra.Role);
+}
 
 bool CSymbolBody::IsExtra(int intvl) const {
   for (int i = 0; i < ExtraCount; ++i)

@@ -38,11 +38,10 @@ struct CSymbolBody {
   CSymbolTone Tones[12];
   int ToneCount = 0;
 
-  /// Whether the type holds a seventh (then extra b9, #9, #11, b13 are written as
-  /// alterations, "C7b9", else as additions, "Caddb9").
-  bool HasSeventh() const;
-  /// Whether the type holds a tone of the role.
-  bool TypeHasRole(int role) const;
+  /// Whether an extra tone is written as an alteration: b9, #9, #11, b13 where the
+  /// type has a seventh but not their degree ("C7b9"), else as an addition
+  /// ("Caddb9", "C9addb9").
+  bool WritesAsAlteration(CSymbolTone extra) const;
   /// Whether the interval is one of the extra tones.
   bool IsExtra(int intvl) const;
   /// The tone of the interval (a member of the set).

@@ -35,11 +35,10 @@ struct WriteCase {
   char const* harte;
 };
 
+// The README's tables hold the vocabulary over C; here the style flags, other roots
+// and the spellings of root and bass.
 std::vector<WriteCase> const WriteCases = {
-    {"C", {"C3", "E3", "G3"}, 0, "C", "C:maj"},
-    {"C", {"C3", "Eb3", "G3"}, 0, "Cm", "C:min"},
     {"A", {"A2", "C3", "E3", "G3"}, 0, "Am7", "A:min7"},
-    {"C", {"C3", "E3", "G3", "B3"}, 0, "Cmaj7", "C:maj7"},
     {"C",
      {"C3", "E3", "G3", "B3"},
      Sym_Triangle,
@@ -65,50 +64,20 @@ std::vector<WriteCase> const WriteCases = {
      "Cm7\xE2\x99\xAD"
      "5",
      "C:hdim7"},
-    {"C", {"C3", "Eb3", "Gb3", "A3"}, 0, "Cdim7", "C:dim7"},
     {"C", {"C3", "Eb3", "Gb3", "A3"}, Sym_DimSign, "Co7", "C:dim7"},
     {"C", {"C3", "Eb3", "Gb3"}, Sym_DimSign | Sym_UnicodeSigns, "C\xC2\xB0", "C:dim"},
-    {"C", {"C3", "E3", "G#3"}, 0, "Caug", "C:aug"},
     {"C", {"C3", "E3", "G#3"}, Sym_PlusSign, "C+", "C:aug"},
-    {"C", {"C3", "F3", "G3"}, 0, "Csus4", "C:sus4"},
-    {"C", {"C3", "D3", "G3"}, 0, "Csus2", "C:sus2"},
-    {"C", {"C3", "F3", "G3", "Bb3"}, 0, "C7sus4", "C:(4,5,b7)"},
-    {"C", {"C3", "G3"}, 0, "C5", "C:(5)"},
-    {"C", {"C3", "E3", "G3", "A3"}, 0, "C6", "C:maj6"},
-    {"C", {"C3", "E3", "G3", "A3", "D4"}, 0, "C6/9", "C:(3,5,6,9)"},
-    {"C", {"C3", "E3", "G3", "D4"}, 0, "Cadd9", "C:(3,5,9)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "D4"}, 0, "C9", "C:9"},
-    {"C", {"C3", "Eb3", "G3", "Bb3", "D4", "F4"}, 0, "Cm11", "C:(b3,5,b7,9,11)"},
-    {"Bb", {"Bb2", "D3", "F3", "Ab3", "C4", "G4"}, 0, "Bb13", "Bb:(3,5,b7,9,13)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "Db4"}, 0, "C7b9", "C:(3,5,b7,b9)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "D#4"}, 0, "C7#9", "C:(3,5,b7,#9)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "F#4"}, 0, "C7#11", "C:(3,5,b7,#11)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "Ab4"}, 0, "C7b13", "C:(3,5,b7,b13)"},
-    {"C", {"C3", "E3", "G#3", "Bb3"}, 0, "C7#5", "C:(3,#5,b7)"},
-    {"C", {"C3", "E3", "Gb3", "Bb3", "D4", "A4"}, 0, "C13b5", "C:(3,b5,b7,9,13)"},
-    {"C", {"C3", "E3", "Gb3", "G#3", "Bb3", "Db4", "D#4"}, 0, "C7b5#5b9#9", "C:(3,b5,#5,b7,b9,#9)"},
     {"C", {"C3", "E3", "Gb3", "G#3", "Bb3", "Db4", "D#4"}, Sym_Alt, "C7alt", "C:(3,b5,#5,b7,b9,#9)"},
-    {"C", {"C3", "E3", "G3", "Bb3", "A4"}, 0, "C7add13", "C:(3,5,b7,13)"},
-    {"C", {"C3", "E3", "F#3", "G3"}, 0, "Cadd#11", "C:(3,5,#11)"},
-    {"C", {"C3", "Eb3", "G3", "Ab3"}, 0, "Cmaddb6", "C:(b3,5,b6)"},
-    // Odd sets: omissions in parentheses, an alteration right after the root there too.
-    {"C", {"C3", "E3", "Gb3"}, 0, "C(b5)", "C:(3,b5)"},
-    {"C", {"C3", "E3", "Bb3"}, 0, "C7(no5)", "C:(3,b7)"},
-    {"C", {"C3", "G3", "Bb3"}, 0, "C7(no3)", "C:(5,b7)"},
-    {"C", {"C3"}, 0, "C(no3,no5)", "C:(1)"},
-    // Slash basses: a chord tone, or an added tone alone after the slash.
-    {"C", {"E3", "G3", "C4"}, 0, "C/E", "C:maj/3"},
-    {"C", {"Bb2", "C3", "E3", "G3"}, 0, "C7/Bb", "C:7/b7"},
+    {"Bb", {"Bb2", "D3", "F3", "Ab3", "C4", "G4"}, 0, "Bb13", "Bb:(3,5,b7,9,13)"},
+    // The bass as the chord spells it, not as the chord's scale would.
+    {"C", {"A#2", "C3", "E3", "G3"}, 0, "C7/A#", "C:7/b7"},
     {"C", {"Eb2", "C3", "G3", "Bb3"}, Sym_UnicodeSigns, "Cm7/E\xE2\x99\xAD", "C:min7/b3"},
-    {"C", {"D2", "C3", "E3", "G3"}, 0, "C/D", "C:(3,5,9)/9"},
     {"A", {"G2", "A2", "C3", "E3"}, 0, "Am7/G", "A:min7/b7"},
-    // A root that is not among the notes.
-    {"C", {"E3", "G3", "B3"}, 0, "Cmaj7(no1)/E", "C:maj7(*1)/3"},
     {"C", {"E3", "G3", "Bb3", "D#4"}, 0, "C7#9(no1)/E", "C:(*1,3,5,b7,#9)/3"},
-    // Spellings as the chord has them, double accidentals included.
+    {"C", {"E3", "Gb3"}, 0, "C(b5,no1)/E", "C:(*1,3,b5)/3"},
     {"Fx", {"B2", "G3", "D4"}, 0, "F##/B", "F##:maj/3"},
     {"Fx", {"B2", "G3", "D4"}, Sym_UnicodeSigns, "F\xF0\x9D\x84\xAA/B", "F##:maj/3"},
-    {"Dbb", {"Dbb3", "Fb3", "Abb3"}, 0, "Dbb", "Dbb:maj"},
+    {"Dbb", {"Dbb3", "Fb3", "Abb3"}, Sym_UnicodeSigns, "D\xF0\x9D\x84\xAB", "Dbb:maj"},
 };
 
 TEST(ChordSymbolWrite, Vocabulary) {

@@ -50,8 +50,7 @@ void CSymbolReader::ReadQuality() {
   } else if (Scan_.Take("m") || Scan_.Take("-")) {
     Quality_ = Quality_Minor;
     MajorSeventh_ = ReadMajorMark(alone); // mM7, mmaj7, mΔ7
-  } else if (Scan_.TakeWord("dim") || Scan_.Take("\xC2\xB0") ||
-             (Scan_.Peek() == 'o' && !Scan_.IsLetterAt(1) && Scan_.Take("o"))) {
+  } else if (Scan_.TakeWord("dim") || Scan_.Take("\xC2\xB0") || (!OmitFollows() && Scan_.Take("o"))) {
     Quality_ = Quality_Dim;
   } else if (Scan_.Take("\xC3\xB8") || Scan_.Take("\xC3\x98")) {
     Quality_ = Quality_HalfDim;
@@ -61,6 +60,12 @@ void CSymbolReader::ReadQuality() {
     Quality_ = Quality_Power;
   }
   if (alone) Extension_ = 7;
+}
+
+// Whether "omit" follows, whose "o" is not the diminished sign ("Coadd9" is).
+bool CSymbolReader::OmitFollows() const {
+  CSymbolScanner ahead = Scan_;
+  return ahead.TakeWord("omit");
 }
 
 // A mark of the major seventh: maj, or ma or j before a number, M, Δ. A Δ without

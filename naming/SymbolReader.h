@@ -95,6 +95,7 @@ private:
   bool ReadLeadSheet();
   void ReadQuality();
   bool ReadMajorMark(bool& alone);
+  bool OmitFollows() const;
   void ReadExtension();
   void ApplyExtension(int ext, bool major);
   bool ReadModifier(bool inGroup);

@@ -1,5 +1,5 @@
-// Round trips of chord symbols: a chord's lead-sheet symbol (plain and with every
-// style flag) and its Harte label read back to the chord's root, pitch classes and
+// Round trips of chord symbols: a chord's lead-sheet symbol (plain and in every
+// combination of style flags) and its Harte label read back to the chord's root, pitch classes and
 // bass, and writing the chord read gives the same text again. Over every pitch-class
 // set above a root with each of its notes in the bass, and over every voicing of the
 // chord-type catalogue and the XG types on all roots in every inversion.
@@ -37,16 +37,16 @@ CFacts FactsOf(CChord const& chord) {
                                        << " bass " << b.BassPc << "/" << b.BassEnh;
 }
 
-// The symbol and the label of the chord read back to its facts and are written the
-// same again.
-void ExpectRoundTrips(CChord const& chord) {
+// The symbol (plain, and in the given combination of style flags) and the label of
+// the chord read back to its facts and are written the same again.
+void ExpectRoundTrips(CChord const& chord, int style) {
   CFacts const facts = FactsOf(chord);
-  for (int style : {0, Sym_UnicodeSigns | Sym_Triangle | Sym_HalfDimSign | Sym_DimSign | Sym_PlusSign | Sym_Alt}) {
-    std::string const symbol = LeadSheetSymbol(chord, style);
+  for (int s : {0, style}) {
+    std::string const symbol = LeadSheetSymbol(chord, s);
     CChord read;
     ASSERT_TRUE(ReadChordSymbol(symbol, read)) << symbol;
     ASSERT_TRUE(SameFacts(facts, FactsOf(read), true)) << symbol << " of " << HarteLabel(chord);
-    ASSERT_EQ(LeadSheetSymbol(read, style), symbol);
+    ASSERT_EQ(LeadSheetSymbol(read, s), symbol);
   }
   std::string const label = HarteLabel(chord);
   CChord read;
@@ -70,12 +70,13 @@ TEST(ChordSymbolRoundTrip, EveryPitchClassSetWithEveryBass) {
       CChord chord;
       chord.SetFromNoteSet(notes);
       chord.SetRootNote(root);
-      ExpectRoundTrips(chord);
+      ExpectRoundTrips(chord, static_cast<int>(set + static_cast<unsigned>(bass)) % 64); // every style
       if (HasFatalFailure()) return;
     }
 }
 
 TEST(ChordSymbolRoundTrip, CatalogueAndXGTypesOnEveryRootInEveryInversion) {
+  int style = 0;
   for (TChordVoicing const& voicing : ChordVoicings()) {
     CMySet<int> noteNrs(voicing.noteNrs.begin(), voicing.noteNrs.end());
     CChord chord;
@@ -83,7 +84,7 @@ TEST(ChordSymbolRoundTrip, CatalogueAndXGTypesOnEveryRootInEveryInversion) {
     chord.SetRootNote(CNote(voicing.rootKeyNr, Enh_Natural));
     chord.SetRootNoteEnhWithLeastSigns();
     chord.AdjustEnhOfChordNotesToRootScale(nullptr);
-    ExpectRoundTrips(chord);
+    ExpectRoundTrips(chord, ++style % 64);
     if (HasFatalFailure()) return;
   }
 }

@@ -66,6 +66,7 @@ std::vector<WriteCase> const WriteCases = {
      "C:hdim7"},
     {"C", {"C3", "Eb3", "Gb3", "A3"}, Sym_DimSign, "Co7", "C:dim7"},
     {"C", {"C3", "Eb3", "Gb3"}, Sym_DimSign | Sym_UnicodeSigns, "C\xC2\xB0", "C:dim"},
+    {"C", {"C3", "Db3", "Eb3", "Gb3"}, Sym_DimSign, "Coaddb9", "C:(b3,b5,b9)"},
     {"C", {"C3", "E3", "G#3"}, Sym_PlusSign, "C+", "C:aug"},
     {"C", {"C3", "E3", "Gb3", "G#3", "Bb3", "Db4", "D#4"}, Sym_Alt, "C7alt", "C:(3,b5,#5,b7,b9,#9)"},
     {"Bb", {"Bb2", "D3", "F3", "Ab3", "C4", "G4"}, 0, "Bb13", "Bb:(3,5,b7,9,13)"},

@@ -142,8 +142,11 @@ CSymbolTone ExtraTone(CSymbolType const& type, int intvl) {
 // The body of the set on the type; false when the type cannot describe it (a tone
 // it needs, such as its seventh, is missing and may not be omitted).
 bool BodyOnType(CSymbolType const& type, unsigned intvls, CSymbolBody& body) {
-  body = CSymbolBody();
+  // Only the counts are reset: the tone arrays are read up to them, and clearing
+  // them for each of the types tried would cost more than the rest.
   body.Type = &type;
+  body.AlteredCount = body.ExtraCount = body.ToneCount = 0;
+  body.Omitted = 0;
   unsigned covered = 0;
   auto take = [&](CSymbolTone tone) {
     body.Tones[body.ToneCount++] = tone;

@@ -26,16 +26,16 @@ struct CSymbolType {
 struct CSymbolBody {
   CSymbolType const* Type = nullptr;
   /// Alterations of the type's own roles ("b5" in C7b5, "b9" in C13b9).
-  CSymbolTone Altered[6];
+  CSymbolTone Altered[6] = {};
   int AlteredCount = 0;
   /// Tones the type does not hold, ascending by degree.
-  CSymbolTone Extra[12];
+  CSymbolTone Extra[12] = {};
   int ExtraCount = 0;
   /// Roles of the type left out (bits 1 << TSymbolRole).
   unsigned Omitted = 0;
   /// Every interval of the set with its degree, from the type, the alterations and
   /// the extras.
-  CSymbolTone Tones[12];
+  CSymbolTone Tones[12] = {};
   int ToneCount = 0;
 
   /// Whether an extra tone is written as an alteration: b9, #9, #11, b13 where the

@@ -19,6 +19,7 @@ ChordSettings Settings(CFuzzInput& in) {
   // The program reads a root with its strict note reader; any note at all is harder.
   settings.HasRoot = in.Pick(4) == 0;
   if (settings.HasRoot) settings.Root = in.Note();
+  settings.Style = static_cast<TNameStyle>(in.Pick(3));
   return settings;
 }
 

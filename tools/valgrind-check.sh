@@ -39,6 +39,7 @@ sweeps+=":IntvlSet.ListQueriesOnAllPitchClassSets:IntvlSet.ComparisonWalksOnlyTh
 sweeps+=":BasicChord.IntervalsInsertedAboveTheOctaveCountInAnyOctave:BasicChord.EveryPitchClassSetOverEveryRootIsRecognised"
 sweeps+=":ChordInKeyCounts.EveryPitchClassSetInEveryKey:MoveInScale.StepsThroughTheScaleNotes"
 sweeps+=":RootFindingByNet.EveryPitchClassSetOverEveryBass"
+sweeps+=":ChordSymbolRoundTrip.EveryPitchClassSetWithEveryBass:ChordSymbolRoundTrip.CatalogueAndXGTypesOnEveryRootInEveryInversion"
 filter=()
 [ $quick = 1 ] && filter=("--gtest_filter=-$sweeps")
 

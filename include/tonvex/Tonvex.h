@@ -5,6 +5,7 @@
 
 #include "Chord.h"
 #include "ChordAnalysisNet.h"
+#include "ChordSymbol.h"
 #include "ChordTimeline.h"
 #include "ChordTypes.h"
 #include "ChordnamePref.h"

@@ -68,6 +68,7 @@ check(seventh.get("notes") == [{"name": "C4", "number": 72}, {"name": "E4", "num
                                {"name": "G4", "number": 79}, {"name": "Bb4", "number": 82}],
       "json: notes of C7 %r" % seventh.get("notes"))
 check(seventh.get("root") == {"name": "C", "key_number": 0}, "json: root of C7 %r" % seventh.get("root"))
+check((seventh.get("symbol"), seventh.get("harte")) == ("C7", "C:7"), "json: symbol and label of C7 %r" % seventh)
 check(seventh.get("basic_chord") == {"number": 1, "name": "", "kind": "major"},
       "json: basic chord of C7 %r" % seventh.get("basic_chord"))
 check(seventh.get("options") == ["7"], "json: options of C7 %r" % seventh.get("options"))
@@ -91,6 +92,7 @@ check(d_major.get("key") == {"name": "C", "signs": 0, "function": "II", "functio
 
 slash = by_name.get("C   / E", {})
 check([n["name"] for n in slash.get("notes", [])] == ["E2", "C3", "G3", "C4"], "json: notes of C/E %r" % slash)
+check((slash.get("symbol"), slash.get("harte")) == ("C/E", "C:maj/3"), "json: symbol and label of C/E %r" % slash)
 check("key" in slash and slash["key"]["notes_outside"] == {"count": 0, "notes": []}, "json: C/E in C %r" % slash)
 
 # One chord from the command line: one object, without a line number; German names.

@@ -35,6 +35,7 @@ bool ReadKey(std::string const& text, CSignKey& key) {
 int ReadSettings(CommandLine const& line, ChordSettings& settings) {
   settings.Algo = line.RulesAlgo != 0 ? SCA_RULE_WEIGHTS : SCA_NEURONAL_NET;
   settings.KeyNumbers = line.KeyNumbers != 0;
+  settings.Style = static_cast<TNameStyle>(line.Style);
   if (!line.Key.empty()) {
     if (!ReadKey(line.Key, settings.Key)) return UsageError(Cmd_Chord, "cannot read key '" + line.Key + "'");
     settings.HasKey = true;
@@ -70,7 +71,8 @@ int NameOneChord(CChordNamer& namer, CommandLine const& line) {
   for (std::string const& operand : line.Operands) {
     std::string problem = namer.Read(operand);
     if (problem.empty()) continue;
-    if (&operand == &line.Operands.front() && IsWord(operand)) problem += " (the commands are note, scale and key)";
+    if (&operand == &line.Operands.front() && IsWord(operand))
+      problem += " (the commands are note, scale, key and symbol)";
     return UsageError(Cmd_Chord, problem);
   }
   if (namer.Empty()) return UsageError(Cmd_Chord, "no notes given");
@@ -144,7 +146,10 @@ std::string ChordUsage() {
                      "  --algo net|rules    find the root with the built-in net (default) or the rules\n"
                      "  --key-numbers       read numbers 0..11 as key numbers (C = 0), the pitch\n"
                      "                      classes of the chord; note names are not read then\n"
-                     "  --json              write a JSON object per chord\n"
+                     "  --style native|leadsheet|harte  the name shown: the library's own name\n"
+                     "                      (default), the lead-sheet symbol (C7, Am7/G) or the\n"
+                     "                      Harte label (C:7, A:min7/b7)\n"
+                     "  --json              write a JSON object per chord (name, symbol and label)\n"
                      "\n"
                      "Naming options:\n") +
          NameStyleOptionsHelp + NoteNameOptionsHelp + OctaveOptionHelp + ChordNameOptionsHelp +
@@ -153,6 +158,8 @@ std::string ChordUsage() {
          "  note NAME...        read note names and show their numbers, spellings and names\n"
          "  scale ROOT TYPE     show a scale's spelled degrees and key signature\n"
          "  key ROOT [minor]    show a key's name, key signature and degrees\n"
+         "  symbol SYMBOL...    read chord symbols (Cmaj7, F#m7b5/C, C:min7/b3) and show\n"
+         "                      their notes\n"
          "Run 'tonvex COMMAND --help' for the options of a command.\n"
          "\n"
          "  --help              show this text\n"

@@ -4,6 +4,7 @@
 #include "NoteToken.h"
 #include "SignsText.h"
 
+#include <tonvex/ChordSymbol.h>
 #include <tonvex/ChordnamePref.h>
 
 namespace {
@@ -83,6 +84,8 @@ void CChordNamer::Analyse() {
     Chord_.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(Settings_.Algo);
     Name_ = Chord_.Name(DefaultChordnamePref);
   }
+  if (Settings_.Style == Style_LeadSheet) Shown_ = LeadSheetSymbol(Chord_);
+  if (Settings_.Style == Style_Harte) Shown_ = HarteLabel(Chord_);
 }
 
 std::string CChordNamer::NoteName(CNote const& note) const {
@@ -102,7 +105,7 @@ std::vector<CNote> CChordNamer::NotesOutsideKey() const {
 }
 
 void CChordNamer::AppendReport(std::string& out) const {
-  out += Name_;
+  out += Shown();
   out += '\n';
   std::string list;
   for (CNote const& note : Chord_.Notes()) {
@@ -146,6 +149,10 @@ void CChordNamer::AppendJson(std::string& out, long lineNr) const {
   }
   json.Key("name");
   json.String(Name_);
+  json.Key("symbol");
+  json.String(LeadSheetSymbol(Chord_));
+  json.Key("harte");
+  json.String(HarteLabel(Chord_));
   json.Key("notes");
   json.BeginArray();
   for (CNote const& note : Chord_.Notes()) {
@@ -219,7 +226,7 @@ std::string CChordNamer::NameLine(std::string_view line, long lineNr, bool json,
   if (json)
     AppendJson(out, lineNr);
   else
-    out += Name_;
+    out += Shown();
   out += '\n';
   return problem;
 }

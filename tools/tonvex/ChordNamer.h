@@ -12,7 +12,10 @@
 #include <string_view>
 #include <vector>
 
-/// How chords are read and analysed.
+/// Which name of a chord is shown.
+enum TNameStyle : int { Style_Native = 0, Style_LeadSheet = 1, Style_Harte = 2 };
+
+/// How chords are read, analysed and shown.
 struct ChordSettings {
   TSingleChordAnalysisAlgo Algo = SCA_NEURONAL_NET;
   /// Numbers are key numbers 0..11 (the chord is built by CChord::SetFromKeyNrSet)
@@ -23,6 +26,8 @@ struct ChordSettings {
   /// A root given by the user replaces root finding.
   bool HasRoot = false;
   CNote Root;
+  /// The name shown by the report and the batch mode; JSON carries all three.
+  TNameStyle Style = Style_Native;
 };
 
 class CChordNamer {
@@ -44,15 +49,18 @@ public:
   void Analyse();
   /// The name: exactly the library's text, trailing blanks included.
   std::string const& Name() const { return Name_; }
-  /// The name and then one line per fact: notes, root, basic chord, options, XG
+  /// The name in the settings' style: Name(), the lead-sheet symbol or the Harte
+  /// label.
+  std::string const& Shown() const { return Settings_.Style == Style_Native ? Name_ : Shown_; }
+  /// The shown name and then one line per fact: notes, root, basic chord, options, XG
   /// chord type, signs and, with a key, the facts of the chord in the key.
   void AppendReport(std::string& out) const;
-  /// One JSON object (no line end) with the same facts; a line number above 0 is
-  /// written first as "line".
+  /// One JSON object (no line end) with the same facts, the name, the lead-sheet
+  /// symbol and the Harte label; a line number above 0 is written first as "line".
   void AppendJson(std::string& out, long lineNr) const;
 
   /// Names the chord of one line of input, as the batch mode does: reads it
-  /// (forgetting the notes before), and unless it holds no notes appends the name,
+  /// (forgetting the notes before), and unless it holds no notes appends the shown name,
   /// or with `json` the JSON object carrying lineNr, and a line end to out. Returns
   /// the empty string, or the problem with the line's first token that is not a
   /// note; then nothing is appended.
@@ -68,6 +76,7 @@ private:
   CMySet<int> KeyNrs_;
   CChord Chord_;
   std::string Name_;
+  std::string Shown_;
 };
 
 #endif

@@ -8,8 +8,8 @@
 
 namespace {
 
-constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key;
-constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key;
+constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key | Cmd_Symbol;
+constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key | Cmd_Symbol;
 
 // An option either stores 1 (a flag), the index of its value among the choices, or
 // its value as text.
@@ -40,7 +40,8 @@ const OptionSpec Options[] = {
     {"--root", Cmd_Chord, nullptr, nullptr, &CommandLine::Root},
     {"--algo", Cmd_Chord, &CommandLine::RulesAlgo, "net|rules", nullptr},
     {"--key-numbers", Cmd_Chord, &CommandLine::KeyNumbers, nullptr, nullptr},
-    {"--json", Cmd_Chord, &CommandLine::Json, nullptr, nullptr},
+    {"--json", Cmd_Chord | Cmd_Symbol, &CommandLine::Json, nullptr, nullptr},
+    {"--style", Cmd_Chord, &CommandLine::Style, "native|leadsheet|harte", nullptr},
 };
 
 OptionSpec const* FindOption(std::string const& name) {
@@ -103,6 +104,7 @@ const char* CommandName(TCommand command) {
   case Cmd_Note: return "note";
   case Cmd_Scale: return "scale";
   case Cmd_Key: return "key";
+  case Cmd_Symbol: return "symbol";
   }
   return "";
 }
@@ -153,7 +155,7 @@ std::string ParseCommandLine(Args const& args, CommandLine& line) {
 
   std::size_t first = 0;
   if (!operands.empty()) {
-    for (TCommand command : {Cmd_Note, Cmd_Scale, Cmd_Key})
+    for (TCommand command : {Cmd_Note, Cmd_Scale, Cmd_Key, Cmd_Symbol})
       if (operands[0] == CommandName(command)) {
         line.Command = command;
         first = 1;

@@ -14,7 +14,7 @@
 using Args = std::vector<std::string>;
 
 /// The commands, as bits so that an option can name the commands it applies to.
-enum TCommand : unsigned { Cmd_Chord = 1u, Cmd_Note = 2u, Cmd_Scale = 4u, Cmd_Key = 8u };
+enum TCommand : unsigned { Cmd_Chord = 1u, Cmd_Note = 2u, Cmd_Scale = 4u, Cmd_Key = 8u, Cmd_Symbol = 16u };
 
 struct CommandLine {
   TCommand Command = Cmd_Chord;
@@ -39,6 +39,7 @@ struct CommandLine {
   // Chord settings.
   int RulesAlgo = 0; // 0 the built-in net finds the root, 1 the rules
   int Json = 0;
+  int Style = 0; // the name shown: 0 native, 1 lead-sheet symbol, 2 Harte label
   int KeyNumbers = 0;
   std::string Key;  // empty: no key
   std::string Root; // empty: find the root

@@ -12,12 +12,14 @@ int RunChordCommand(CommandLine const& line);
 int RunNoteCommand(CommandLine const& line);
 int RunScaleCommand(CommandLine const& line);
 int RunKeyCommand(CommandLine const& line);
+int RunSymbolCommand(CommandLine const& line);
 
 /// The help texts (standard output for --help, standard error after a usage error).
 std::string ChordUsage(); // the program's help: the chord command and the list of commands
 std::string NoteUsage();
 std::string ScaleUsage();
 std::string KeyUsage();
+std::string SymbolUsage();
 
 /// Prints "tonvex[ COMMAND]: <text>" on standard error; returns 2.
 int UsageError(TCommand command, std::string const& text);

@@ -45,6 +45,11 @@ void CJsonWriter::Bool(bool value) {
   Out_ += value ? "true" : "false";
 }
 
+void CJsonWriter::Null() {
+  BeforeValue();
+  Out_ += "null";
+}
+
 void AppendJsonString(std::string& out, std::string_view text) {
   static const char Hex[] = "0123456789abcdef";
   out += '"';

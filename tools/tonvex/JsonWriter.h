@@ -27,6 +27,7 @@ public:
   void String(std::string_view text);
   void Int(long value);
   void Bool(bool value);
+  void Null();
 
 private:
   void BeforeValue();

@@ -18,6 +18,7 @@ std::string UsageOf(TCommand command) {
   case Cmd_Note: return NoteUsage();
   case Cmd_Scale: return ScaleUsage();
   case Cmd_Key: return KeyUsage();
+  case Cmd_Symbol: return SymbolUsage();
   case Cmd_Chord: break;
   }
   return ChordUsage();
@@ -42,6 +43,7 @@ int main(int argc, char** argv) {
   case Cmd_Note: return RunNoteCommand(line);
   case Cmd_Scale: return RunScaleCommand(line);
   case Cmd_Key: return RunKeyCommand(line);
+  case Cmd_Symbol: return RunSymbolCommand(line);
   case Cmd_Chord: break;
   }
   return RunChordCommand(line);

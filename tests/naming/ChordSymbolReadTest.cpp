@@ -1,0 +1,138 @@
+// Reading chord symbols: the vocabulary with the spellings people type, Harte labels,
+// slash basses and no chord, each read into notes that are written out by hand (from
+// the bass up, spelled by degree); and texts that cannot be read, with the place
+// named and the chord left as it was.
+#include <tonvex/ChordSymbol.h>
+
+#include <gtest/gtest.h>
+
+#include <string>
+#include <vector>
+
+namespace {
+
+std::string NoteNames(CChord const& chord) {
+  std::string names;
+  for (CNote const& note : chord.Notes()) names += (names.empty() ? "" : " ") + note.KeyName(DefaultChordnamePref);
+  return names;
+}
+
+struct ReadCase {
+  std::vector<char const*> symbols; // all read as the same chord
+  char const* root;
+  char const* notes;
+};
+
+// The README's tables hold the vocabulary's pitch classes over C; here the spelled
+// notes of the voicing, other roots, cases and signs.
+std::vector<ReadCase> const ReadCases = {
+    {{"CMA7", "C M7", "Cma7"}, "C", "C E G B"},
+    {{"CMin7", "cm7", "C m7"}, "C", "C Eb G Bb"},
+    {{"Cdim7", "C\xC2\xB0"
+               "7"},
+     "C",
+     "C Eb Gb Bbb"},
+    {{"C7#9", "C:(3,5,b7,#9)"}, "C", "C E G Bb D#"},
+    {{"C7b13"}, "C", "C E G Bb Ab"},
+    {{"C7alt"}, "C", "C E Gb G# Bb Db D#"},
+    {{"C6/9", "C69"}, "C", "C E G A D"},
+    {{"C13#11"}, "C", "C E G Bb D F# A"},
+    {{"Cadd9"}, "C", "C E G D"},
+    {{"Cadd2"}, "C", "C D E G"},
+    {{"Cadd4"}, "C", "C E F G"},
+    {{"Cadd11"}, "C", "C E G F"},
+    {{"Cmaj7(no1)", "C:maj7(*1)"}, "C", "E G B"},
+    {{"C:min7(*5,11)"}, "C", "C Eb Bb F"},
+    {{"C/E", "C/3"}, "C", "E G C"},
+    {{"C/D"}, "C", "D E G C"},
+    {{"C7/A#"}, "C", "A# C E G"},
+    {{"Am7/G", "A:min7/b7"}, "A", "G A C E"},
+    {{"C:min7/b3"}, "C", "Eb G Bb C"},
+    {{"C6/9/E"}, "C", "E G A C D"},
+    {{"F#m7b5/C"}, "F#", "C E F# A"},
+    {{"Bb13", "bb13"}, "Bb", "Bb D F Ab C G"},
+    {{"Eb7#9", "E\xE2\x99\xAD"
+               "7\xE2\x99\xAF"
+               "9"},
+     "Eb",
+     "Eb G Bb Db F#"},
+    {{"Ab7b13"}, "Ab", "Ab C Eb Gb Fb"},
+    {{"Db7b9"}, "Db", "Db F Ab Cb Ebb"},
+    {{"B7#9"}, "B", "B D# F# A Cx"},
+    {{"C#m7", "C\xE2\x99\xAF"
+              "m7"},
+     "C#",
+     "C# E G# B"},
+    {{"Fx", "F##", "F\xF0\x9D\x84\xAA"}, "Fx", "Fx Ax Cx"},
+    {{"Dbb", "D\xF0\x9D\x84\xAB"}, "Dbb", "Dbb Fb Abb"},
+    {{"Fbdim7"}, "Fb", "Fb Abb Cbb C#"}, // no triple flat: the usual spelling
+    {{"Bb:min9"}, "Bb", "Bb Db F Ab C"},
+};
+
+TEST(ChordSymbolRead, Vocabulary) {
+  for (ReadCase const& c : ReadCases)
+    for (char const* symbol : c.symbols) {
+      CChord chord;
+      CChordSymbolProblem problem;
+      ASSERT_TRUE(ReadChordSymbol(symbol, chord, &problem))
+          << symbol << ": " << problem.Reason << " at " << problem.Offset;
+      EXPECT_EQ(chord.RootNote().KeyName(DefaultChordnamePref), c.root) << symbol;
+      EXPECT_TRUE(chord.RootNoteSpecified()) << symbol;
+      EXPECT_EQ(NoteNames(chord), c.notes) << symbol;
+    }
+}
+
+TEST(ChordSymbolRead, NoChord) {
+  for (char const* symbol : {"N", "N.C.", "NC", "n.c", " N "}) {
+    CChord chord;
+    chord.SetFromNoteNrSet(CMySet<int>{60, 64});
+    ASSERT_TRUE(ReadChordSymbol(symbol, chord)) << symbol;
+    EXPECT_TRUE(chord.IsUndefined()) << symbol;
+    EXPECT_EQ(chord.NoteCount(), 0u) << symbol;
+  }
+}
+
+struct ProblemCase {
+  char const* text;
+  std::size_t offset;
+  char const* part;
+};
+
+std::vector<ProblemCase> const Problems = {
+    {"", 0, ""},
+    {"H7", 0, "H7"},
+    {"Cmaj7x9", 5, "x9"},
+    {"Cbbb", 3, "b"},
+    {"C7(b9", 5, ""},
+    {"C7b9)", 4, ")"},
+    {"C7(b9,(#11))", 6, "(#11))"},
+    {"C7 extra", 3, "extra"},
+    {"Cadd7", 1, "add7"},
+    {"Cno4", 3, "4"},
+    {"C7(maj7)", 3, "maj7)"},
+    {"C/X", 2, "X"},
+    {"C/E/G", 3, "/G"},
+    {"C:foo", 2, "foo"},
+    {"C:(3;5)", 4, ";5)"},
+    {"C:(3,14)", 5, "14)"},
+    {"C:maj/x", 6, "x"},
+    {"C(no1,no3,no5)", 0, "C(no1,no3,no5)"},
+    {"X", 0, "X"},
+};
+
+TEST(ChordSymbolRead, ProblemsNameThePlaceAndLeaveTheChord) {
+  for (ProblemCase const& c : Problems) {
+    CChord chord;
+    ASSERT_TRUE(ReadChordSymbol("Am7/G", chord));
+    CChord const before = chord;
+    CChordSymbolProblem problem;
+    EXPECT_FALSE(ReadChordSymbol(c.text, chord, &problem)) << c.text;
+    EXPECT_TRUE(chord == before) << c.text;
+    EXPECT_EQ(problem.Offset, c.offset) << c.text;
+    EXPECT_EQ(problem.Part, c.part) << c.text;
+    EXPECT_FALSE(problem.Reason.empty()) << c.text;
+    EXPECT_FALSE(ReadChordSymbol(c.text, chord)) << c.text; // without a problem to fill
+  }
+}
+
+} // namespace

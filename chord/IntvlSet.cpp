@@ -52,6 +52,13 @@ void CIntvlSet::SetIntvlsFromList(int const* values, std::size_t count) {
     InsertIntvl(values[k]);
 }
 
+void SetIntvlsFromMask(CIntvlSet& set, std::uint32_t mask) {
+  int values[32];
+  std::size_t count = 0;
+  for (; mask != 0; mask &= mask - 1) values[count++] = __builtin_ctz(mask); // the lowest bit set
+  set.SetIntvlsFromList(values, count);
+}
+
 bool CIntvlSet::HasIntvlsFromList(int const* values, std::size_t count) const {
   for (std::size_t k = 0; k < count && !EndsFillList(values[k]); ++k)
     if (!HasIntvl(values[k])) return false;

@@ -98,7 +98,7 @@ void AddSlashBass(CChordName& name, CChordnamePref& pref) {
   CNote bass = chord.LowestNote();
   if (bass.KeyNr() == chord.RootNote().KeyNr()) return;
   CChord::TBasicChord bc = name.BasicChord();
-  CScale scale = ChordScale(chord.RootNote(), bc, chord.IntvlSet());
+  CScale scale = ChordScale(chord.RootNote(), bc, chord.HasIntvl(1));
   RespellStoredLowestNote(chord.Notes(), scale);
   bass.AdjustEnhToScale(scale);
   name.Bass = bass.KeyName(pref);

@@ -27,7 +27,7 @@ struct CIntvlMasks {
   CIntvlMasks() = default;
   explicit CIntvlMasks(CIntvlSet const& set) {
     for (int m : set) {
-      if (m < set.WrapIntvl()) AnyOctave |= Mask{1} << (m % 12);
+      if (m < set.WrapIntvl()) AnyOctave |= Mask{1} << (m < 12 ? m : m % 12);
       if (m > 31)
         ExactFits = false;
       else

@@ -73,15 +73,18 @@ struct CNetInput {
   bool SharedNoteNr = false;  ///< two notes have the same number (in two spellings)
 };
 
+// CNote::KeyNr of a note whose number is not negative.
+int KeyNrOf(CNote const& note) { return static_cast<int>(static_cast<unsigned long>(note.NoteNr()) % 12u); }
+
 // False when a note number is negative: its key number is, and the interval cache
 // would not hold its pitch class interval.
 bool ReadNetInput(CMySet<CNote> const& notes, CNetInput& in) {
   if (notes.begin()->NoteNr() < 0) return false; // the lowest: then all are
-  in.Lowest = notes.begin()->KeyNr();
+  in.Lowest = KeyNrOf(*notes.begin());
   in.Intvls = 1;
   for (auto note = notes.begin() + 1; note != notes.end(); ++note) {
-    int const k = note->KeyNr();
-    in.Intvls |= std::uint32_t{1} << PitchClass(k - in.Lowest);
+    int const k = KeyNrOf(*note);
+    in.Intvls |= std::uint32_t{1} << (k >= in.Lowest ? k - in.Lowest : k - in.Lowest + 12);
     in.LowestDoubled = in.LowestDoubled || k == in.Lowest;
     in.SharedNoteNr = in.SharedNoteNr || note->NoteNr() == note[-1].NoteNr();
   }
@@ -125,7 +128,11 @@ void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisA
     bool const minorSecond = (intvls & 2u) != 0;
     RootNote_ = RootSpellings.Root(bc, root);
     RootNoteSpecified_ = 1;
-    for (CNote const& note : Notes_) note.SetEnh(RootSpellings.NoteEnh(bc, minorSecond, root, note.KeyNr()));
+    for (CNote const& note : Notes_) {
+      // A note spelled as it is to end is left alone; SetEnh checks what it sets.
+      CRootSpellings::CNoteEnh const enh = RootSpellings.NoteEnh(bc, minorSecond, root, KeyNrOf(note));
+      if (note.Enh() != enh.Checked) note.SetEnh(static_cast<TEnh>(enh.Unchecked));
+    }
     if (in.SharedNoteNr) MergeRespelledNotes(Notes_);
     SetIntvlsFromMask(Intvls_, intvls);
     IntvlsStale_ = 0;

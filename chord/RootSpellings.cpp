@@ -27,8 +27,11 @@ CRootSpellings::CRootSpellings() {
       for (bool minorSecond : {false, true}) {
         CScale const scale = ChordScale(Roots_[b][pc], bc, minorSecond);
         // Spellings stay within a few accidentals of natural.
-        for (int k = 0; k < 12; ++k)
-          NoteEnhs_[b][minorSecond ? 1 : 0][pc][k] = static_cast<signed char>(scale.EnhForKeynr(k));
+        for (int k = 0; k < 12; ++k) {
+          TEnh const unchecked = scale.EnhForKeynr(k);
+          NoteEnhs_[b][minorSecond ? 1 : 0][pc][k] = {static_cast<signed char>(unchecked),
+                                                      static_cast<signed char>(CNote(k, unchecked).Enh())};
+        }
       }
     }
   }

@@ -31,14 +31,19 @@ public:
   /// bc (0..7): LeastSignsRoot of CNote(pitchClass, Enh_Natural).
   CNote const& Root(CChord::TBasicChord bc, int pitchClass) const { return Roots_[bc][pitchClass]; }
   /// The spelling the chord's scale (ChordScale) on Root(bc, rootPitchClass) gives
-  /// key number 0..11, unchecked, as CNote::AdjustEnhToScale takes it.
-  TEnh NoteEnh(CChord::TBasicChord bc, bool minorSecond, int rootPitchClass, int keyNr) const {
-    return static_cast<TEnh>(NoteEnhs_[bc][minorSecond ? 1 : 0][rootPitchClass][keyNr]);
+  /// key number 0..11, unchecked, as CNote::AdjustEnhToScale takes it; and the
+  /// spelling CNote::CheckEnh makes of it, which a note ends with.
+  struct CNoteEnh {
+    signed char Unchecked;
+    signed char Checked;
+  };
+  CNoteEnh NoteEnh(CChord::TBasicChord bc, bool minorSecond, int rootPitchClass, int keyNr) const {
+    return NoteEnhs_[bc][minorSecond ? 1 : 0][rootPitchClass][keyNr];
   }
 
 private:
   CNote Roots_[8][12];
-  signed char NoteEnhs_[8][2][12][12];
+  CNoteEnh NoteEnhs_[8][2][12][12];
 };
 
 /// Built when the library is loaded (chord/LoadTimeObjects.cpp); never changed.

@@ -131,7 +131,10 @@ constexpr struct CSlotOfRank {
 
 void CChordOptions::Add(int rank, CChord::TChordOption option) {
   int const slot = rank >= 0 && rank < MaxRank + 1 ? SlotOfRank.Of[rank] : -1;
-  if (slot >= 0 && Option[slot] == NoOption) Option[slot] = option;
+  if (slot >= 0 && Option[slot] == NoOption) {
+    Option[slot] = option;
+    Filled |= 1u << slot;
+  }
 }
 
 char const* OptionText(int option) { return (option >= 0 && option < OptionCount) ? OptionTexts[option] : ""; }
@@ -161,8 +164,8 @@ CChordOptions FindChordOptions(CChord const& chord, CChord::TBasicChord bc) {
 void JoinOptions(CChordOptions const& options, CNameParts& name) {
   bool parentheses = CChordnamePref::ChordOptionSep == 1;
   bool first = true;
-  for (int option : options.Option) {
-    if (option == CChordOptions::NoOption) continue;
+  for (unsigned filled = options.Filled; filled != 0; filled &= filled - 1) {
+    int const option = options.Option[__builtin_ctz(filled)]; // the lowest filled slot
     if (!first) name.Add(parentheses ? "(" : "/");
     name.Add(OptionText(option));
     if (!first && parentheses) name.Add(")");

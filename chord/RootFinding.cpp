@@ -118,9 +118,10 @@ void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisA
   }
   CNetInput in;
   if (algo == SCA_NEURONAL_NET && Intvls_.WrapIntvl() >= 12 && ReadNetInput(Notes_, in)) {
-    // The intervals lie within the octave, as the cache holds them: the spellings and
-    // the cache that the steps below leave come from tables (chord/RootSpellings.h),
-    // the same in every bit.
+    // No note number below 0 and a wrap interval that folds nothing within the
+    // octave: the cache would hold the pitch class intervals, so the root, the
+    // spellings, the cache and its mark that the steps further below leave follow
+    // from bit masks and tables (chord/RootSpellings.h), the same in every bit.
     int const winner = NetRootWinners.Winner(in.Intvls);
     int const root = (in.Lowest + winner) % 12;
     std::uint32_t const intvls = IntvlsAboveRoot(in.Intvls, winner);

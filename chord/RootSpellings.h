@@ -18,8 +18,8 @@
 /// toward the flats, or one toward the sharps, by the magnitude of KeySignCount;
 /// ties keep the root, then prefer the flats. The root's own count is taken with the
 /// basic chord `bcAsIs`, the other two with `bcOthers` (a chord's interval cache may
-/// be rebuilt between them). A spelling that is not senseful is respelled by the
-/// count, as KeySignCount does to the note it is given.
+/// be rebuilt between them). The root comes back as given; a flatter or sharper
+/// spelling as its count leaves it (KeySignCount respells one that is not senseful).
 CNote LeastSignsRoot(CNote const& root, CChord::TBasicChord bcAsIs, CChord::TBasicChord bcOthers);
 
 class CRootSpellings {

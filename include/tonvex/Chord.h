@@ -40,7 +40,8 @@
 //     they set the process-wide Neuron parameters that root finding by net reads;
 //   - one CChord object used by two threads at once, even through const members
 //     only: the queries rebuild its interval cache, SignsCount and NameWithSlash
-//     respell its notes.
+//     respell its notes; the same for a note handed to a call that respells it
+//     (the root given to NameForThisRootNote or NameWithLeastSignsForThisRootNote).
 #ifndef TONVEX_CHORD_H
 #define TONVEX_CHORD_H
 

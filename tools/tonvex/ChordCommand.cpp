@@ -25,16 +25,23 @@ public:
   /// end of the input or when it could not be read (then Failed).
   bool Next(std::string_view& line) {
     for (;;) {
-      std::size_t const end = Text_.find('\n', Start_);
-      if (end != std::string::npos || AtEnd_) {
-        if (end == std::string::npos && (Failed_ || Start_ == Text_.size())) return false;
-        std::size_t const stop = end != std::string::npos ? end : Text_.size();
-        line = std::string_view(Text_).substr(Start_, stop - Start_);
-        Start_ = end != std::string::npos ? end + 1 : stop;
+      // Only what has not been searched yet: a long line costs no more than its length.
+      std::size_t const end = Text_.find('\n', Searched_);
+      if (end != std::string::npos) {
+        line = std::string_view(Text_).substr(Start_, end - Start_);
+        Start_ = Searched_ = end + 1;
+        return true;
+      }
+      Searched_ = Text_.size();
+      if (AtEnd_) {
+        if (Failed_ || Start_ == Text_.size()) return false;
+        line = std::string_view(Text_).substr(Start_);
+        Start_ = Text_.size();
         return true;
       }
       // The unfinished line moves to the front and the next block follows it.
       Text_.erase(0, Start_);
+      Searched_ -= Start_;
       Start_ = 0;
       Read();
     }
@@ -54,7 +61,8 @@ private:
   }
 
   std::string Text_;
-  std::size_t Start_ = 0;
+  std::size_t Start_ = 0;    ///< where the next line begins
+  std::size_t Searched_ = 0; ///< Text_ holds no line end before this
   bool AtEnd_ = false;
   bool Failed_ = false;
 };

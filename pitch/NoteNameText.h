@@ -1,6 +1,6 @@
-// Note names written into a buffer of their own (internal): the chord names put the
-// root and the bass together from pieces, and a std::string per note name would
-// cost a call per character.
+// Note names written into a buffer of their own (internal): chord names are put
+// together from pieces, and building a std::string for the root and another for the
+// bass cost more than the rest of many a name.
 #ifndef TONVEX_PITCH_NOTENAMETEXT_H
 #define TONVEX_PITCH_NOTENAMETEXT_H
 
@@ -9,7 +9,7 @@
 #include <cstddef>
 #include <string_view>
 
-/// A note name: at most five characters ("Ceses", "Eisis", "Undefined" aside).
+/// A note name: up to five characters ("Ceses", "Eisis"), or "Undefined".
 class CNoteNameText {
 public:
   void Add(char c) { Text_[Size_++] = c; }

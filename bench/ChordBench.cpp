@@ -1,5 +1,6 @@
 // Chords: building from note numbers, root finding, naming and the host's whole path.
 #include "BenchSupport.h"
+#include <tonvex/Neuron.h>
 
 #include <string>
 
@@ -35,6 +36,18 @@ void BM_RootByRules(benchmark::State& state) { RootFinding(state, SCA_RULE_WEIGH
 void BM_RootByNet(benchmark::State& state) { RootFinding(state, SCA_NEURONAL_NET); }
 TONVEX_BENCHMARK(BM_RootByRules);
 TONVEX_BENCHMARK(BM_RootByNet);
+
+// Root finding by net after another net has changed the Neuron parameters: the
+// winner comes from the exact forward pass instead of the table made at load. Only
+// the output threshold differs here, which the net's output type never reads, so the
+// answers stay the built-in net's.
+void BM_RootByNetExactPass(benchmark::State& state) {
+  float const builtIn = Neuron::output_threshold;
+  Neuron::output_threshold = 0.5f;
+  RootFinding(state, SCA_NEURONAL_NET);
+  Neuron::output_threshold = builtIn;
+}
+TONVEX_BENCHMARK(BM_RootByNetExactPass);
 
 // What a host does for every incoming note: one chord object, set from the sounding
 // note numbers, its root found by the net, its name made.

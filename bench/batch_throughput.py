@@ -1,12 +1,12 @@
 #!/usr/bin/env python3
 """Throughput of the tonvex program's batch mode: lines named per second.
 
-Writes a file of chord lines (the voicings of bench/Voicings.cpp, same generator and
-seed, continued to the requested count; even lines as note names, odd lines as note
-numbers separated by commas), then times `tonvex < file > /dev/null` several times,
-pinned to one core with taskset when it is available. The whole process is timed,
-start-up included. Prints the best and the median run; the best is the figure to
-compare, since other load on the machine only ever makes a run slower.
+Writes a file of chord lines (the voicings of tests/support/Voicings.cpp, same
+generator and seed, continued to the requested count; even lines as note names, odd
+lines as note numbers separated by commas), then times `tonvex < file > /dev/null`
+several times, pinned to one core with taskset when it is available. The whole
+process is timed, start-up included. Prints the best and the median run; the best is
+the figure to compare, since other load on the machine only ever makes a run slower.
 """
 import argparse
 import os

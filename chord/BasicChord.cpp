@@ -24,9 +24,10 @@ struct CIntvlMasks {
   Mask Exact = 0;
   bool ExactFits = true;
 
+  CIntvlMasks() = default;
   explicit CIntvlMasks(CIntvlSet const& set) {
     for (int m : set) {
-      if (m < set.WrapIntvl()) AnyOctave |= Mask{1} << (m % 12);
+      if (m < set.WrapIntvl()) AnyOctave |= Mask{1} << (m < 12 ? m : m % 12);
       if (m > 31)
         ExactFits = false;
       else
@@ -142,9 +143,15 @@ CScale::TType ChordScaleType(CChord::TBasicChord bc) {
   return (bc == CChord::bc_min || bc == CChord::bc_dim) ? CScale::Scale_Minor : CScale::Scale_Major;
 }
 
-CScale ChordScale(CNote const& root, CChord::TBasicChord bc, CIntvlSet const& intvls) {
+CChord::TBasicChord BasicChordOfPitchClasses(std::uint32_t intvls) {
+  CIntvlMasks masks;
+  masks.AnyOctave = masks.Exact = intvls;
+  return BasicChordOf(masks);
+}
+
+CScale ChordScale(CNote const& root, CChord::TBasicChord bc, bool minorSecond) {
   CScale scale(root, ChordScaleType(bc));
-  if (intvls.HasIntvl(1)) {
+  if (minorSecond) {
     // The minor second one step below the second degree: over C, D flat.
     int second = PitchClass(scale.RootNote().KeyNr() + 2);
     scale.SetEnhForChromStep(1, static_cast<TEnh>(scale.EnhForKeynr(second) - 1));
@@ -156,7 +163,7 @@ CScale::TType CChord::ScaleType() const { return ChordScaleType(BasicChord()); }
 
 CScale CChord::Scale() const {
   TBasicChord bc = BasicChord(); // brings the cache up to date
-  return ChordScale(RootNote_, bc, Intvls_);
+  return ChordScale(RootNote_, bc, Intvls_.HasIntvl(1));
 }
 
 int CChord::XGChordIx() const {

@@ -2,9 +2,11 @@
 // comping range operations.
 #include "Chord.h"
 
+#include "chord/IntvlFold.h"
 #include "pitch/NoteNrs.h"
 
 #include <algorithm>
+#include <cstdint>
 #include <utility>
 
 namespace {
@@ -27,8 +29,25 @@ void CChord::SetFromNoteSet(CMySet<CNote> notes) {
 
 void CChord::SetFromNoteNrSet(CMySet<int> const& noteNrs) {
   Clear();
-  // The note constructor clamps to 0..127 (255 passes) and respells the naturals.
-  for (int noteNr : noteNrs) AddNote(CNote(noteNr, Enh_Natural));
+  // What adding the notes one by one leaves: the numbers ascend and stay in order
+  // when clamped (the note constructor clamps to 0..127, 255 passes, and respells
+  // the naturals), so the first note is the root all along, and each note's
+  // difference to it goes into the (stale) cache by the insertion rule. Differences
+  // lie in 0..255; under a wrap interval up to 32 they fold below 32 and are
+  // collected in a mask.
+  int const wrap = Intvls_.WrapIntvl();
+  bool const masked = wrap > 0 && wrap <= 32;
+  std::uint32_t intvls = 0;
+  for (int noteNr : noteNrs) {
+    CNote const note(noteNr, Enh_Natural);
+    Notes_.insert(note);
+    int const difference = static_cast<int>(note.NoteNr() - Notes_.begin()->NoteNr());
+    if (masked)
+      intvls |= std::uint32_t{1} << FoldedIntvl(difference, wrap);
+    else
+      Intvls_.InsertIntvl(difference);
+  }
+  if (masked) SetIntvlsFromMask(Intvls_, intvls);
   SetRootNoteWithoutSpecify(LowestNote());
 }
 

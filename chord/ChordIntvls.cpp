@@ -21,34 +21,26 @@ constexpr int KeyNrListEnd = -1;
 } // namespace
 
 void CChord::UpdateIntvlSet() const {
-  LowestNoteLonely_ = 1;
   // A key number lies in -11..11 (note number % 12), so a difference of two lies in
   // -22..22 and its folded interval in 0..22: a mask collects the intervals, which
   // then go into the cache in ascending order.
-  constexpr int MaxFolded = 22;
   std::uint32_t folded = 0;
+  bool lonely = true;
   if (!Notes_.empty()) {
-    int rootKeyNr = RootNote_.KeyNr();
-    int lowest = PitchClassIntvl(*Notes_.begin(), RootNote_);
-    bool first = true;
-    for (CNote const& note : Notes_) {
+    int const rootKeyNr = RootNote_.KeyNr();
+    int const wrap = Intvls_.WrapIntvl();
+    int const lowest = PitchClassIntvl(*Notes_.begin(), RootNote_);
+    folded = std::uint32_t{1} << FoldedIntvl(Notes_.begin()->KeyNr() - rootKeyNr, wrap);
+    for (auto note = Notes_.begin() + 1; note != Notes_.end(); ++note) {
       // raw stays signed on purpose: a repeat of the lowest pitch class that lies
       // below the root's pitch class number never clears the mark.
-      int raw = note.KeyNr() - rootKeyNr;
-      folded |= std::uint32_t{1} << FoldedIntvl(raw, Intvls_.WrapIntvl());
-      if (!first && raw == lowest) LowestNoteLonely_ = 0;
-      first = false;
+      int const raw = note->KeyNr() - rootKeyNr;
+      folded |= std::uint32_t{1} << FoldedIntvl(raw, wrap);
+      lonely = lonely && raw != lowest;
     }
   }
-  // Every candidate is written and only the members are counted: no branch on the
-  // bits, which differ from chord to chord.
-  int intvls[MaxFolded + 1];
-  std::size_t count = 0;
-  for (int intvl = 0; intvl <= MaxFolded; ++intvl) {
-    intvls[count] = intvl;
-    count += folded >> intvl & 1u;
-  }
-  Intvls_.SetIntvlsFromList(intvls, count);
+  LowestNoteLonely_ = lonely ? 1 : 0;
+  SetIntvlsFromMask(Intvls_, folded);
   IntvlsStale_ = 0;
 }
 

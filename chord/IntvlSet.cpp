@@ -49,7 +49,14 @@ private:
 void CIntvlSet::SetIntvlsFromList(int const* values, std::size_t count) {
   Intvls_.clear();
   for (std::size_t k = 0; k < count && !EndsFillList(values[k]) && Intvls_.size() <= MaxFilledCount; ++k)
-    InsertIntvl(values[k]);
+    Intvls_.insert(FoldedIntvl(values[k], WrapIntvl_)); // InsertIntvl, in line
+}
+
+void SetIntvlsFromMask(CIntvlSet& set, std::uint32_t mask) {
+  int values[32];
+  std::size_t count = 0;
+  for (; mask != 0; mask &= mask - 1) values[count++] = __builtin_ctz(mask); // the lowest bit set
+  set.SetIntvlsFromList(values, count);
 }
 
 bool CIntvlSet::HasIntvlsFromList(int const* values, std::size_t count) const {

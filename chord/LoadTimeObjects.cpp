@@ -5,6 +5,8 @@
 #include "ChordAnalysisNet.h"
 #include "Note.h"
 #include "chord/NetForSingleChordAnalysis.h"
+#include "chord/NetRootWinners.h"
+#include "chord/RootSpellings.h"
 
 // The undefined note; see Note.h.
 extern TONVEX_API const CNote CNote_Undef(255, Enh_Natural);
@@ -18,3 +20,10 @@ extern TONVEX_API const CChord CChord_Undef(CNote(255, Enh_Natural), CChord::bc_
 // The built-in chord analysis net; see chord/NetForSingleChordAnalysis.h. The
 // weights come from the record's own pointer, the second argument is ignored.
 NeuronalNet NetForSingleChordAnalysis(ChordAnalysisNeuronalNet, weight_definitions);
+
+// Root finding's answers from that net, found while the Neuron parameters are the
+// ones its construction has just set; see chord/NetRootWinners.h.
+const CNetRootWinners NetRootWinners(NetForSingleChordAnalysis);
+
+// The spellings root finding gives; see chord/RootSpellings.h.
+const CRootSpellings RootSpellings;

@@ -2,13 +2,15 @@
 // notes after it, and the small root operations around them.
 #include "Chord.h"
 
+#include "chord/ChordScale.h"
+#include "chord/IntvlFold.h"
 #include "chord/NetForSingleChordAnalysis.h"
-#include "pitch/KeySignCount.h"
+#include "chord/NetRootWinners.h"
+#include "chord/RootSpellings.h"
 #include "pitch/NoteNrs.h"
 
-#include <cstddef>
+#include <cstdint>
 #include <cstdlib>
-#include <vector>
 
 namespace {
 
@@ -48,30 +50,63 @@ CNote LikeliestRootByRules(CChord const& chord) {
   return bestRoot;
 }
 
-// The built-in net's input vector, kept between calls so that root finding allocates
-// nothing once the first call has sized it. Shared as the net itself is.
-std::vector<float>& NetInputs() {
-  static std::vector<float> inputs;
-  return inputs;
-}
-
 // The root the built-in net chooses: the chord's root is set to its lowest note, the
-// intervals above it (0..11) become the net's inputs, and the winning output w is
-// the root's interval above the lowest note. The root is that pitch class in the
-// lowest octave, in the natural spelling (C major's spelling for a black key).
+// intervals above it become the net's inputs, and the winning output w is the root's
+// interval above the lowest note. The root is that pitch class in the lowest octave,
+// in the natural spelling (C major's spelling for a black key).
 CNote LikeliestRootByNet(CChord& chord) {
   CNote const lowest = chord.LowestNote();
   chord.SetRootNote(lowest);
-  // Nets store their counts made valid, never negative.
-  auto const inputCount = static_cast<std::size_t>(NetForSingleChordAnalysis.get_input_neuron_count());
-  std::vector<float>& inputs = NetInputs();
-  inputs.assign(inputCount, 0.0f);
+  // A rebuilt cache holds intervals 0..22 only (key numbers lie in -11..11).
+  std::uint32_t intvls = 0;
   for (int intvl : chord.IntvlSet())
-    if (intvl >= 0 && static_cast<std::size_t>(intvl) < inputCount) inputs[static_cast<std::size_t>(intvl)] = 1.0f;
-  NetForSingleChordAnalysis.setInput(inputs);
-  NetForSingleChordAnalysis.use();
-  int const winner = NetForSingleChordAnalysis.winner();
+    if (intvl >= 0 && intvl < 32) intvls |= std::uint32_t{1} << intvl;
+  int const winner = NetRootWinners.Winner(intvls);
   return CNote(PitchClass(PitchClass(lowest.NoteNr()) + winner), Enh_Natural);
+}
+
+// What root finding by net reads from a chord's notes, in one walk.
+struct CNetInput {
+  int Lowest = 0;             ///< the lowest note's key number
+  std::uint32_t Intvls = 0;   ///< bit i: a note's key number lies i above the lowest one's (0..11)
+  bool LowestDoubled = false; ///< a higher note has the lowest note's key number
+  bool SharedNoteNr = false;  ///< two notes have the same number (in two spellings)
+};
+
+// CNote::KeyNr of a note whose number is not negative.
+int KeyNrOf(CNote const& note) { return static_cast<int>(static_cast<unsigned long>(note.NoteNr()) % 12u); }
+
+// False when a note number is negative: its key number is, and the interval cache
+// would not hold its pitch class interval.
+bool ReadNetInput(CMySet<CNote> const& notes, CNetInput& in) {
+  if (notes.begin()->NoteNr() < 0) return false; // the lowest: then all are
+  in.Lowest = KeyNrOf(*notes.begin());
+  in.Intvls = 1;
+  for (auto note = notes.begin() + 1; note != notes.end(); ++note) {
+    int const k = KeyNrOf(*note);
+    in.Intvls |= std::uint32_t{1} << (k >= in.Lowest ? k - in.Lowest : k - in.Lowest + 12);
+    in.LowestDoubled = in.LowestDoubled || k == in.Lowest;
+    in.SharedNoteNr = in.SharedNoteNr || note->NoteNr() == note[-1].NoteNr();
+  }
+  return true;
+}
+
+// The intervals above the root w semitones above the lowest note, from those above
+// the lowest note: a rotation of the twelve pitch classes.
+std::uint32_t IntvlsAboveRoot(std::uint32_t aboveLowest, int w) {
+  return ((aboveLowest >> w) | (aboveLowest << (12 - w))) & 0xfffu;
+}
+
+// Respelling can give two notes of one pitch the same spelling; the set keeps such a
+// note once. They are neighbours, since the notes are ordered by number.
+void MergeRespelledNotes(CMySet<CNote>& notes) {
+  for (auto pos = notes.begin(); pos != notes.end();) {
+    auto next = pos + 1;
+    if (next != notes.end() && *next == *pos)
+      pos = notes.erase(next) - 1;
+    else
+      pos = next;
+  }
 }
 
 } // namespace
@@ -79,6 +114,33 @@ CNote LikeliestRootByNet(CChord& chord) {
 void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisAlgo algo) {
   if (Notes_.empty()) {
     SetUndefined();
+    return;
+  }
+  CNetInput in;
+  if (algo == SCA_NEURONAL_NET && Intvls_.WrapIntvl() >= 12 && ReadNetInput(Notes_, in)) {
+    // No note number below 0 and a wrap interval that folds nothing within the
+    // octave: the cache would hold the pitch class intervals, so the root, the
+    // spellings, the cache and its mark that the steps further below leave follow
+    // from bit masks and tables (chord/RootSpellings.h), the same in every bit.
+    int const winner = NetRootWinners.Winner(in.Intvls);
+    int const root = (in.Lowest + winner) % 12;
+    std::uint32_t const intvls = IntvlsAboveRoot(in.Intvls, winner);
+    TBasicChord const bc = BasicChordOfPitchClasses(intvls);
+    bool const minorSecond = (intvls & 2u) != 0;
+    RootNote_ = RootSpellings.Root(bc, root);
+    RootNoteSpecified_ = 1;
+    for (CNote const& note : Notes_) {
+      // A note spelled as it is to end is left alone; SetEnh checks what it sets.
+      CRootSpellings::CNoteEnh const enh = RootSpellings.NoteEnh(bc, minorSecond, root, KeyNrOf(note));
+      if (note.Enh() != enh.Checked) note.SetEnh(static_cast<TEnh>(enh.Unchecked));
+    }
+    if (in.SharedNoteNr) MergeRespelledNotes(Notes_);
+    SetIntvlsFromMask(Intvls_, intvls);
+    IntvlsStale_ = 0;
+    // The rebuild's mark: a higher note at the lowest note's interval above the root
+    // clears it, and a key number 0..11 lies there only when the lowest note's key
+    // number is not below the root's.
+    LowestNoteLonely_ = in.LowestDoubled && in.Lowest >= root ? 0 : 1;
     return;
   }
   SetRootNote(algo == SCA_NEURONAL_NET ? LikeliestRootByNet(*this) : LikeliestRootByRules(*this));
@@ -95,29 +157,16 @@ void CChord::SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(TSingleChordAnalysisA
 void CChord::SetRootNoteEnhWithLeastSigns() {
   RootNote_.CheckEnh();
   CNote const asIs = RootNote_;
-  bool const rebuiltBySignsCount = IntvlsStale_ != 0;
-  int const signsAsIs = std::abs(SignsCount());
-
-  // The other spellings are counted with the root set to them, which marks the
-  // intervals stale. They keep the root's note number, so the intervals rebuilt for
-  // them are those of the root as it is: when SignsCount has just rebuilt them, the
-  // basic chord it read serves all three; otherwise they are rebuilt once here.
-  if (!rebuiltBySignsCount) SetRootNote(asIs);
-  TBasicChord const bc = BasicChord();
-  CNote flatter = asIs;
-  flatter.EnhShiftToFlats();
-  CNote sharper = asIs;
-  sharper.EnhShiftToSharps();
-  int const signsFlatter = std::abs(KeySignCount(flatter, bc));
-  int const signsSharper = std::abs(KeySignCount(sharper, bc));
-
-  // Ties keep the spelling as it is, then prefer the flats.
-  if (signsAsIs <= signsFlatter && signsAsIs <= signsSharper)
-    SetRootNote(asIs);
-  else if (signsAsIs > signsFlatter && signsFlatter <= signsSharper)
-    SetRootNote(flatter);
-  else
-    SetRootNote(sharper);
+  // The root's own count reads the basic chord of the cache as it stands (rebuilt
+  // when stale). The other spellings are counted with the root set to them, which
+  // marks the intervals stale; they keep the root's note number, so the intervals
+  // rebuilt for them are those of the root as it is: when the count has just
+  // rebuilt them, its basic chord serves all three; otherwise they are rebuilt once
+  // here.
+  bool const rebuiltForAsIs = IntvlsStale_ != 0;
+  TBasicChord const bcAsIs = BasicChord();
+  if (!rebuiltForAsIs) SetRootNote(asIs);
+  SetRootNote(LeastSignsRoot(asIs, bcAsIs, BasicChord()));
 }
 
 void CChord::AdjustEnhOfChordNotesToRootScale(bool* changed) {
@@ -126,15 +175,7 @@ void CChord::AdjustEnhOfChordNotesToRootScale(bool* changed) {
     note.AdjustEnhToScale(scale);
     note.CheckEnh();
   }
-  // Notes of one pitch in two spellings now have the same spelling; the set keeps
-  // such a note once. They are neighbours, since the notes are ordered by number.
-  for (auto pos = Notes_.begin(); pos != Notes_.end();) {
-    auto next = pos + 1;
-    if (next != Notes_.end() && *next == *pos)
-      pos = Notes_.erase(next) - 1;
-    else
-      pos = next;
-  }
+  MergeRespelledNotes(Notes_);
   if (changed) *changed = false;
 }
 

@@ -3,6 +3,7 @@
 #include "chord/ChordScale.h"
 #include "naming/ChordOptions.h"
 #include "naming/NameParts.h"
+#include "pitch/NoteNameText.h"
 
 #include <cctype>
 
@@ -36,8 +37,8 @@ public:
 
   CChord const& Chord;
   CNameParts Parts;
-  std::string Root;
-  std::string Bass;
+  CNoteNameText Root;
+  CNoteNameText Bass;
 
 private:
   CChord::TBasicChord BasicChord_ = CChord::bc_none;
@@ -64,17 +65,17 @@ void AddBlock(CChordName& name) {
   }
 }
 
-void AddNameWithoutSlash(CChordName& name, CChordnamePref& pref) {
+void AddNameWithoutSlash(CChordName& name) {
   CChord const& chord = name.Chord;
   if (chord.RootNote().NoteNr() == 255) {
     name.Parts.Add("No Chord");
     return;
   }
-  name.Root = chord.RootNote().KeyName(pref);
+  name.Root = KeyNameText(chord.RootNote());
   // A small letter marks minor, and "m" is written all the same ("c m 7").
-  if (CChordnamePref::MinorSmall != 0 && !name.Root.empty() && name.BasicChord() == CChord::bc_min)
-    name.Root[0] = static_cast<char>(std::tolower(static_cast<unsigned char>(name.Root[0])));
-  name.Parts.Add(name.Root);
+  if (CChordnamePref::MinorSmall != 0 && !name.Root.Empty() && name.BasicChord() == CChord::bc_min)
+    name.Root.Front() = static_cast<char>(std::tolower(static_cast<unsigned char>(name.Root.Front())));
+  name.Parts.Add(name.Root.View());
   if (chord.NoteCount() > 1) AddBlock(name);
 }
 
@@ -93,17 +94,17 @@ void RespellStoredLowestNote(CMySet<CNote> const& notes, CScale const& scale) {
 
 // The slash and the bass, when the bass's key number (the undefined note's for a
 // chord without notes) differs from the root's; plain remainders are compared.
-void AddSlashBass(CChordName& name, CChordnamePref& pref) {
+void AddSlashBass(CChordName& name) {
   CChord const& chord = name.Chord;
   CNote bass = chord.LowestNote();
   if (bass.KeyNr() == chord.RootNote().KeyNr()) return;
   CChord::TBasicChord bc = name.BasicChord();
-  CScale scale = ChordScale(chord.RootNote(), bc, chord.IntvlSet());
+  CScale scale = ChordScale(chord.RootNote(), bc, chord.HasIntvl(1));
   RespellStoredLowestNote(chord.Notes(), scale);
   bass.AdjustEnhToScale(scale);
-  name.Bass = bass.KeyName(pref);
+  name.Bass = KeyNameText(bass);
   name.Parts.Add(SeparateBlocks() ? ",/ " : " / ");
-  name.Parts.Add(name.Bass);
+  name.Parts.Add(name.Bass.View());
 }
 
 // The C major scale, whose spellings a root that is not senseful takes.
@@ -124,16 +125,16 @@ std::string CChord::BasicChordAndOptionsName(CChordnamePref& /*pref*/) const {
   return name.Parts.Join();
 }
 
-std::string CChord::NameWithoutSlash(CChordnamePref& pref) const {
+std::string CChord::NameWithoutSlash(CChordnamePref& /*pref*/) const {
   CChordName name(*this);
-  AddNameWithoutSlash(name, pref);
+  AddNameWithoutSlash(name);
   return name.Parts.Join();
 }
 
-std::string CChord::NameWithSlash(CChordnamePref& pref) const {
+std::string CChord::NameWithSlash(CChordnamePref& /*pref*/) const {
   CChordName name(*this);
-  AddNameWithoutSlash(name, pref);
-  AddSlashBass(name, pref);
+  AddNameWithoutSlash(name);
+  AddSlashBass(name);
   return name.Parts.Join();
 }
 

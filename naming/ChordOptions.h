@@ -16,6 +16,8 @@ struct CChordOptions {
   /// The option in each slot, or NoOption.
   int Option[SlotCount] = {NoOption, NoOption, NoOption, NoOption, NoOption, NoOption, NoOption,
                            NoOption, NoOption, NoOption, NoOption, NoOption, NoOption, NoOption};
+  /// Bit s set when slot s holds an option.
+  unsigned Filled = 0;
 
   /// Fills the slot of the rank unless an option is there already: the first found
   /// stays, as map insertion keeps an existing key.

@@ -3,6 +3,7 @@
 #define TONVEX_NAMING_NAMEPARTS_H
 
 #include <cstddef>
+#include <cstring>
 #include <string>
 #include <string_view>
 
@@ -25,9 +26,13 @@ public:
   }
 
   std::string Join() const {
-    std::string text;
-    text.reserve(Length_);
-    for (int i = 0; i < Count_; ++i) text.append(Parts_[i].Text, Parts_[i].Size);
+    // Sized once, then the pieces copied in place: no append call per piece.
+    std::string text(Length_, '\0');
+    char* out = text.data();
+    for (int i = 0; i < Count_; ++i) {
+      std::memcpy(out, Parts_[i].Text, Parts_[i].Size);
+      out += Parts_[i].Size;
+    }
     return text;
   }
 

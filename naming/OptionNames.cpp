@@ -4,6 +4,7 @@
 
 #include "pitch/NoteNrs.h"
 
+#include <cstdint>
 #include <initializer_list>
 
 namespace {
@@ -28,14 +29,39 @@ CChord::TChordOption Maj7Option() {
   }
 }
 
+// The members of an interval cache for the membership tests of the option rules: as
+// bits when they all lie below 32 (as they do after a rebuild), else the set itself.
+class CMembers {
+public:
+  explicit CMembers(CIntvlSet const& set) : Set_(set) {
+    for (int m : set) {
+      if (m > 31) Fits_ = false;
+      Bits_ |= Fits_ ? std::uint32_t{1} << m : 0;
+    }
+  }
+  bool Has(int n) const { return Fits_ ? n >= 0 && n < 32 && (Bits_ >> n & 1u) != 0 : Set_.HasIntvl(n); }
+  // CIntvlSet::HasOtherStackedThirdsOptionThan.
+  bool HasOtherThan(int intvl) const {
+    if (!Fits_) return Set_.HasOtherStackedThirdsOptionThan(intvl);
+    std::uint32_t others = Bits_ & ~std::uint32_t{1u << 0 | 1u << 3 | 1u << 4 | 1u << 7};
+    if (intvl >= 0 && intvl < 32) others &= ~(std::uint32_t{1} << intvl);
+    return others != 0;
+  }
+
+private:
+  CIntvlSet const& Set_;
+  std::uint32_t Bits_ = 0;
+  bool Fits_ = true;
+};
+
 // The option that the interval `intvl` (a member of the cache, its row chosen by its
 // pitch class) gives in a chord of basic chord bc. "has n" is exact membership in
 // the cache; "other thirds" asks for a member other than 0, 3, 4, 7 and the interval
 // itself as it is cached (so a ninth cached as 14 is "add 9" over a triad).
-void AddOptionOfIntvl(CChordOptions& options, CIntvlSet const& intvls, int intvl, CChord::TBasicChord bc) {
+void AddOptionOfIntvl(CChordOptions& options, CMembers const& members, int intvl, CChord::TBasicChord bc) {
   using C = CChord;
-  auto has = [&intvls](int n) { return intvls.HasIntvl(n); };
-  auto otherThirds = [&intvls, intvl] { return intvls.HasOtherStackedThirdsOptionThan(intvl); };
+  auto has = [&members](int n) { return members.Has(n); };
+  auto otherThirds = [&members, intvl] { return members.HasOtherThan(intvl); };
   // The major sixth: a diminished seventh in a diminished chord.
   auto addSixth = [&] { options.Add(9, bc == C::bc_dim ? C::co_7 : C::co_6); };
 
@@ -90,14 +116,25 @@ void AddOptionOfIntvl(CChordOptions& options, CIntvlSet const& intvls, int intvl
   }
 }
 
+// The slot of each rank 0..99 in CChordOptions, -1 for ranks without one.
+constexpr int MaxRank = 99;
+constexpr struct CSlotOfRank {
+  signed char Of[MaxRank + 1] = {};
+  constexpr CSlotOfRank() {
+    for (signed char& slot : Of) slot = -1;
+    for (int slot = 0; slot < CChordOptions::SlotCount; ++slot)
+      Of[CChordOptions::Ranks[slot]] = static_cast<signed char>(slot);
+  }
+} SlotOfRank;
+
 } // namespace
 
 void CChordOptions::Add(int rank, CChord::TChordOption option) {
-  for (int slot = 0; slot < SlotCount; ++slot)
-    if (Ranks[slot] == rank) {
-      if (Option[slot] == NoOption) Option[slot] = option;
-      return;
-    }
+  int const slot = rank >= 0 && rank < MaxRank + 1 ? SlotOfRank.Of[rank] : -1;
+  if (slot >= 0 && Option[slot] == NoOption) {
+    Option[slot] = option;
+    Filled |= 1u << slot;
+  }
 }
 
 char const* OptionText(int option) { return (option >= 0 && option < OptionCount) ? OptionTexts[option] : ""; }
@@ -116,9 +153,10 @@ CChordOptions FindChordOptions(CChord const& chord, CChord::TBasicChord bc) {
                     highest.NoteNr() - lowest.NoteNr() > 12;
   int lowestIntvl = PitchClass(lowest.KeyNr() - chord.RootNote().KeyNr());
 
+  CMembers const members(intvls);
   for (int intvl : intvls) {
     if (omitLonely && intvl == lowestIntvl) continue;
-    AddOptionOfIntvl(options, intvls, intvl, bc);
+    AddOptionOfIntvl(options, members, intvl, bc);
   }
   return options;
 }
@@ -126,8 +164,8 @@ CChordOptions FindChordOptions(CChord const& chord, CChord::TBasicChord bc) {
 void JoinOptions(CChordOptions const& options, CNameParts& name) {
   bool parentheses = CChordnamePref::ChordOptionSep == 1;
   bool first = true;
-  for (int option : options.Option) {
-    if (option == CChordOptions::NoOption) continue;
+  for (unsigned filled = options.Filled; filled != 0; filled &= filled - 1) {
+    int const option = options.Option[__builtin_ctz(filled)]; // the lowest filled slot
     if (!first) name.Add(parentheses ? "(" : "/");
     name.Add(OptionText(option));
     if (!first && parentheses) name.Add(")");

@@ -1,6 +1,7 @@
 // Neuron evaluation: input, activation and output functions and the derivative.
 #include "Neuron.h"
 #include "nnet/FastPath.h"
+#include "nnet/NeuronValue.h"
 
 #include <algorithm>
 #include <cmath>
@@ -107,10 +108,14 @@ Neuron& Neuron::operator=(Neuron other) {
   return *this;
 }
 
+float NeuronValue(float const* inputs, int n, float const* weights, int weightCount, float& netInput) {
+  netInput = NetInput(inputs, weights, n, weightCount);
+  const float a = Activation(netInput);
+  return Neuron::output_type == OUTPUT_BIN ? (a >= Neuron::output_threshold ? 1.0f : 0.0f) : a;
+}
+
 void Neuron::calcValue(float const* inputs, int n, float* outputs, int index) {
-  net_input = NetInput(inputs, weights.get(), n, input_count);
-  const float a = Activation(net_input);
-  output = output_type == OUTPUT_BIN ? (a >= output_threshold ? 1.0f : 0.0f) : a;
+  output = NeuronValue(inputs, n, weights.get(), input_count, net_input);
   outputs[index] = output;
 }
 

@@ -42,10 +42,21 @@ struct CNetLayer {
 /// weights[(b * inputs + i) * PackedLanes + l], 0 in the lanes past its last neuron.
 void PackLayers(CNetLayer const* layers, int layerCount, std::vector<float>& weights);
 
+/// PackLayers for one layer of `count` neurons whose weights stand in the flat order
+/// (neuron j's weight from input i at flat[j * inputs + i]): writes its
+/// PackedWeightCount(count, inputs) packed weights to `packed`.
+void PackFlatLayer(int count, int inputs, float const* flat, float* packed);
+
 /// Neuron::calcVec's fast path (INPUT_SUM, ACT_SIGM, OUTPUT_NONE, with the current
 /// threshold and slope) of a layer whose weights PackLayers wrote at `weights`:
 /// every neuron's net input, cached exponential and output and outputs[0..Count-1]
 /// get the very bits calcVec gives them. Allocates nothing.
 void ForwardPackedLayer(CNetLayer const& layer, float const* weights, float const* inputs, float* outputs);
+
+/// ForwardPackedLayer for a layer of `count` neurons with `inputs` inputs that only
+/// writes outputs[0..count-1], the same bits, and no neuron: it reads nothing but
+/// its arguments and the Neuron parameters, so any number of threads may run it at
+/// once.
+void ForwardPackedOutputs(int count, int inputs, float const* weights, float const* in, float* outputs);
 
 #endif

@@ -53,6 +53,8 @@ struct CSignCounts {
 
 int StartRow(int basicChord) { return basicChord == Minor ? 1 : (basicChord == Diminished ? 2 : 0); }
 
+// Computed on first use (safe under threads, and done while the library is loaded:
+// the tables of root finding count signs); only read afterwards.
 CSignCounts const& SignCounts() {
   static CSignCounts const counts = [] {
     CSignCounts table{};

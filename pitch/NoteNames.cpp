@@ -1,6 +1,8 @@
 // Note names in English, German and solmisation style, and octave names.
 #include "NoteNames.h"
 
+#include "pitch/NoteNameText.h"
+
 #include <string>
 
 namespace {
@@ -39,73 +41,73 @@ int PitchClass(int keyNr) {
   return k < 0 ? k + 12 : k;
 }
 
-std::string RomanName(int k, Path path) {
-  std::string name;
+CNoteNameText RomanName(int k, Path path) {
+  CNoteNameText name;
   switch (path) {
   case Path::Flat:
-    name = RomanString1[k];
-    name += 'b';
-    if (SecondFlat[k] == 'b') name += 'b';
+    name.Add(RomanString1[k]);
+    name.Add('b');
+    if (SecondFlat[k] == 'b') name.Add('b');
     return name;
-  case Path::DoubleFlatOnEbBb: return k == 10 ? "Dobb" : "Fabb";
+  case Path::DoubleFlatOnEbBb: name.Add(k == 10 ? "Dobb" : "Fabb"); return name;
   case Path::Sharp:
-    name = RomanString2[k];
-    name += SharpSign[k];
+    name.Add(RomanString2[k]);
+    name.Add(SharpSign[k]);
     return name;
-  case Path::DoubleSharpOnCsFs: return k == 6 ? "Mix" : "Tix";
+  case Path::DoubleSharpOnCsFs: name.Add(k == 6 ? "Mix" : "Tix"); return name;
   case Path::Plain: break;
   }
-  name = RomanString3[k];
-  if (PlainSpellingSign[k] != ' ') name += PlainSpellingSign[k];
+  name.Add(RomanString3[k]);
+  if (PlainSpellingSign[k] != ' ') name.Add(PlainSpellingSign[k]);
   return name;
 }
 
-std::string GermanName(int k, Path path) {
-  std::string name;
+CNoteNameText GermanName(int k, Path path) {
+  CNoteNameText name;
   switch (path) {
   case Path::Flat:
-    name = UpperNeighbourLetterGerman[k];
-    name += "es";
-    if (SecondFlat[k] == 'b') name += "es";
+    name.Add(UpperNeighbourLetterGerman[k]);
+    name.Add("es");
+    if (SecondFlat[k] == 'b') name.Add("es");
     break;
-  case Path::DoubleFlatOnEbBb: return k == 10 ? "Ceses" : "Feses";
+  case Path::DoubleFlatOnEbBb: name.Add(k == 10 ? "Ceses" : "Feses"); return name;
   case Path::Sharp:
-    name = LowerNeighbourLetter[k];
-    name += SpellEnharm1[k];
+    name.Add(LowerNeighbourLetter[k]);
+    name.Add(SpellEnharm1[k]);
     return name;
-  case Path::DoubleSharpOnCsFs: return k == 6 ? "Eisis" : "Bisis";
+  case Path::DoubleSharpOnCsFs: name.Add(k == 6 ? "Eisis" : "Bisis"); return name;
   case Path::Plain:
-    name = NaturalLetterGerman[k];
-    if (SpellEnharm2[k][0] != ' ') name += SpellEnharm2[k];
+    name.Add(NaturalLetterGerman[k]);
+    if (SpellEnharm2[k][0] != ' ') name.Add(SpellEnharm2[k]);
     break;
   }
-  if (name == "Hes") return "B";
-  if (name == "Aes") return "As";
-  if (name == "Ees") return "Es";
+  if (name.View() == "Hes") name.Set("B");
+  if (name.View() == "Aes") name.Set("As");
+  if (name.View() == "Ees") name.Set("Es");
   return name;
 }
 
-std::string EnglishName(int k, Path path) {
-  std::string name;
+CNoteNameText EnglishName(int k, Path path) {
+  CNoteNameText name;
   switch (path) {
   case Path::Flat:
-    name = UpperNeighbourLetter[k];
-    name += 'b';
-    if (SecondFlat[k] == 'b') name += 'b';
+    name.Add(UpperNeighbourLetter[k]);
+    name.Add('b');
+    if (SecondFlat[k] == 'b') name.Add('b');
     break;
-  case Path::DoubleFlatOnEbBb: name = k == 10 ? "Cbb" : "Fbb"; break;
+  case Path::DoubleFlatOnEbBb: name.Add(k == 10 ? "Cbb" : "Fbb"); break;
   case Path::Sharp:
-    name = LowerNeighbourLetter[k];
-    name += SharpSign[k];
+    name.Add(LowerNeighbourLetter[k]);
+    name.Add(SharpSign[k]);
     break;
-  case Path::DoubleSharpOnCsFs: name = k == 6 ? "Ex" : "Bx"; break;
+  case Path::DoubleSharpOnCsFs: name.Add(k == 6 ? "Ex" : "Bx"); break;
   case Path::Plain:
-    name = NaturalLetter[k];
-    if (PlainSpellingSign[k] != ' ') name += PlainSpellingSign[k];
+    name.Add(NaturalLetter[k]);
+    if (PlainSpellingSign[k] != ' ') name.Add(PlainSpellingSign[k]);
     break;
   }
-  if (CChordnamePref::B_is_H && name[0] == 'B' && name != "Bb") name[0] = 'H';
-  if (CChordnamePref::Bb_is_B && name == "Bb") name = "B";
+  if (CChordnamePref::B_is_H && name.Front() == 'B' && name.View() != "Bb") name.Front() = 'H';
+  if (CChordnamePref::Bb_is_B && name.View() == "Bb") name.Set("B");
   return name;
 }
 
@@ -135,14 +137,29 @@ std::string RomanSyllable(int k, Path path) {
   return RomanString3[k];
 }
 
+std::string Text(CNoteNameText const& name) { return std::string(name.View()); }
+
 } // namespace
 
-std::string KeyNrAndEnhToName(int keyNr, TEnh enh, CChordnamePref const& /*pref*/) {
+CNoteNameText KeyNameText(int keyNr, TEnh enh) {
   int k = PitchClass(keyNr);
   Path path = PathOf(k, enh);
   if (CChordnamePref::RomanNames) return RomanName(k, path);
   if (CChordnamePref::AccidentalsAsLetters) return GermanName(k, path);
   return EnglishName(k, path);
+}
+
+CNoteNameText KeyNameText(CNote const& note) {
+  if (note.NoteNr() == 255) {
+    CNoteNameText undefined;
+    undefined.Add("Undefined");
+    return undefined;
+  }
+  return KeyNameText(note.KeyNr(), note.Enh());
+}
+
+std::string KeyNrAndEnhToName(int keyNr, TEnh enh, CChordnamePref const& /*pref*/) {
+  return Text(KeyNameText(keyNr, enh));
 }
 
 std::string KeyNrToNameIgnoringEnh(int keyNr, TEnh enh, CChordnamePref const& pref) {
@@ -153,10 +170,7 @@ std::string KeyNrToNameIgnoringEnh(int keyNr, TEnh enh, CChordnamePref const& pr
   return EnglishLetter(k, path);
 }
 
-std::string CNote::KeyName(CChordnamePref const& pref) const {
-  if (NoteNr_ == 255) return "Undefined";
-  return KeyNrAndEnhToName(KeyNr(), Enh_, pref);
-}
+std::string CNote::KeyName(CChordnamePref const& /*pref*/) const { return Text(KeyNameText(*this)); }
 
 std::string CNote::KeyNameWithoutEnh(CChordnamePref const& pref) const {
   if (NoteNr_ == 255) return "Undefined";

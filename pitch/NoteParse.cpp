@@ -3,6 +3,7 @@
 #include "Note.h"
 
 #include <climits>
+#include <string_view>
 
 namespace {
 
@@ -34,7 +35,7 @@ bool IsSpace(char c) { return c == ' ' || (c >= '\t' && c <= '\r'); }
 // Decimal conversion with the rules of atoi (leading white space, a sign, digits up
 // to the first other character, 0 without digits), saturating instead of
 // overflowing so that an absurdly long octave number stays defined.
-int ReadOctaveNumber(std::string const& text, std::size_t i) {
+int ReadOctaveNumber(std::string_view text, std::size_t i) {
   while (i < text.size() && IsSpace(text[i])) ++i;
   bool negative = false;
   if (i < text.size() && (text[i] == '+' || text[i] == '-')) negative = text[i++] == '-';
@@ -49,7 +50,10 @@ int Wrapped(int keyNr) { return ((keyNr % 12) + 12) % 12; }
 
 } // namespace
 
-bool CNote::SetFromString(std::string text, CChordnamePref const& /*pref*/) {
+bool CNote::SetFromString(std::string textGiven, CChordnamePref const& /*pref*/) {
+  // Read through a view: its length and characters stay in registers across the
+  // calls below, which the string's own members would not.
+  std::string_view const text = textGiven;
   std::size_t i = 0;
   while (i < text.size() && text[i] == ' ') ++i;
   if (i == text.size()) return false;

@@ -50,7 +50,9 @@ void SpellingByKeySignature(CNote const& root, bool minor, TEnh (&enh)[12]) {
 
 // The spelling tables of the roots a scale can have (key number 0..11, a senseful
 // spelling), major and minor, computed once: every chord spelled after its root
-// builds a scale, often more than one per chord.
+// builds a scale, often more than one per chord. Computed on first use, which the
+// language makes safe under threads and which the tables of root finding make
+// while the library is loaded; only read afterwards.
 struct CSpellings {
   signed char Enh[2][12][5][12];
 };

@@ -29,6 +29,19 @@
 // or -1, and undefined results are the undefined note or chord. Operations that move
 // notes by octaves (Invert, SetLowestNoteInOctave) can leave note numbers 128..131,
 // which are kept as they are.
+//
+// Threads. A chord keeps all its state in itself, and what the library shares (the
+// tables of root finding, the spelling tables, the built-in net's data) is built
+// when the library is loaded and only read afterwards. So any number of threads may
+// at once work on chords of their own: set their notes, find their roots by net or
+// by rules, name them, relate them to keys. Not safe while other threads do that:
+//   - changing a naming preference (CChordnamePref: all are process-wide statics);
+//   - building, copying or training a NeuronalNet, or calling Neuron::SetCalcParams:
+//     they set the process-wide Neuron parameters that root finding by net reads;
+//   - one CChord object used by two threads at once, even through const members
+//     only: the queries rebuild its interval cache, SignsCount and NameWithSlash
+//     respell its notes; the same for a note handed to a call that respells it
+//     (the root given to NameForThisRootNote or NameWithLeastSignsForThisRootNote).
 #ifndef TONVEX_CHORD_H
 #define TONVEX_CHORD_H
 
@@ -381,15 +394,18 @@ public:
   /// and the natural spelling. So E4 G4 C5 gives the inputs {0, 3, 8}, the winner 8
   /// and the root C. The current root plays no part.
   ///
-  /// The net is one process-wide object that keeps its last inputs and outputs, so
-  /// root finding by net must not run on two threads at once; asking it allocates
-  /// nothing after the first call (its input vector is kept). It evaluates with the process-wide Neuron parameters
-  /// (Neuron.h) as they stand: loading the library sets them to the built-in net's,
-  /// and building any other NeuronalNet afterwards replaces them, which changes the
-  /// net's answers. The library does not restore them. A host that builds nets of
-  /// its own in the same process should build one from ChordAnalysisNeuronalNet
-  /// last (or call Neuron::SetCalcParams with its properties) before it finds roots
-  /// by net again.
+  /// The net's answers are those of its forward pass under the process-wide Neuron
+  /// parameters (Neuron.h) as they stand: loading the library sets them to the
+  /// built-in net's, and building any other NeuronalNet afterwards replaces them,
+  /// which changes the net's answers. The library does not restore them. A host
+  /// that builds nets of its own in the same process should build one from
+  /// ChordAnalysisNeuronalNet last (or call Neuron::SetCalcParams with its
+  /// properties) before it finds roots by net again. While the parameters are the
+  /// built-in net's, the winners come from a table made at load, one per set of
+  /// intervals above a lowest note within the octave; otherwise from the exact
+  /// forward pass of a read-only copy of the net. Either way nothing is allocated,
+  /// locked or written outside this chord: chords on different threads may find
+  /// their roots at once (see Threads above).
   ///
   /// Both algorithms finish with SetRootNoteEnhWithLeastSigns and then
   /// AdjustEnhOfChordNotesToRootScale.

@@ -67,7 +67,9 @@ public:
   /// Inserts the value unless an equal one is present; returns its position and
   /// whether it was inserted.
   std::pair<iterator, bool> insert(T const& value) {
-    T* pos = std::lower_bound(Data_, Data_ + Size_, value);
+    // Sets are mostly filled in ascending order: a value above the last one goes to
+    // the end without a search.
+    T* pos = (Size_ != 0 && Data_[Size_ - 1] < value) ? Data_ + Size_ : std::lower_bound(Data_, Data_ + Size_, value);
     if (pos != Data_ + Size_ && !(value < *pos)) return {pos, false};
     // A value equal to none of the elements is no reference into them, so growing
     // cannot leave it dangling.

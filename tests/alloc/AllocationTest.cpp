@@ -46,9 +46,6 @@ std::uint64_t NameAllocations(std::string const& name) { return name.size() > st
 TEST(Allocation, HostPathAllocatesOnlyLongNames) {
   std::vector<CMySet<int>> const voicings = Voicings();
   CChord reused(24);
-  // The first use of root finding sizes the built-in net's input buffer.
-  reused.SetFromNoteNrSet(voicings.front());
-  reused.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_NEURONAL_NET);
   int longNames = 0;
   for (CMySet<int> const& voicing : voicings) {
     for (TSingleChordAnalysisAlgo algo : {SCA_NEURONAL_NET, SCA_RULE_WEIGHTS}) {

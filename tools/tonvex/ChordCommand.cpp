@@ -4,14 +4,68 @@
 #include "Commands.h"
 #include "NoteToken.h"
 
+#include <cerrno>
 #include <cstdio>
-#include <iostream>
+#include <string_view>
 #include <unistd.h>
 
 namespace {
 
-// Output is collected and written in blocks of about this size.
+// Output is collected and written in blocks of about this size, and input read in
+// blocks of this size.
 constexpr std::size_t OutputBlock = 1 << 16;
+constexpr std::size_t InputBlock = 1 << 16;
+
+// Standard input cut into lines as std::getline cuts them: a last line without its
+// line end counts, nothing after the last line end does. Read with read(2), which
+// gives a pipe or file in whole blocks and a terminal a line as soon as it is typed.
+class CLineReader {
+public:
+  /// The next line, without its line end, valid until the next call; false at the
+  /// end of the input or when it could not be read (then Failed).
+  bool Next(std::string_view& line) {
+    for (;;) {
+      // Only what has not been searched yet: a long line costs no more than its length.
+      std::size_t const end = Text_.find('\n', Searched_);
+      if (end != std::string::npos) {
+        line = std::string_view(Text_).substr(Start_, end - Start_);
+        Start_ = Searched_ = end + 1;
+        return true;
+      }
+      Searched_ = Text_.size();
+      if (AtEnd_) {
+        if (Failed_ || Start_ == Text_.size()) return false;
+        line = std::string_view(Text_).substr(Start_);
+        Start_ = Text_.size();
+        return true;
+      }
+      // The unfinished line moves to the front and the next block follows it.
+      Text_.erase(0, Start_);
+      Searched_ -= Start_;
+      Start_ = 0;
+      Read();
+    }
+  }
+  bool Failed() const { return Failed_; }
+
+private:
+  void Read() {
+    std::size_t const kept = Text_.size();
+    Text_.resize(kept + InputBlock);
+    ssize_t count = 0;
+    do count = read(STDIN_FILENO, Text_.data() + kept, InputBlock);
+    while (count < 0 && errno == EINTR);
+    Text_.resize(kept + static_cast<std::size_t>(count > 0 ? count : 0));
+    AtEnd_ = count <= 0;
+    Failed_ = count < 0;
+  }
+
+  std::string Text_;
+  std::size_t Start_ = 0;    ///< where the next line begins
+  std::size_t Searched_ = 0; ///< Text_ holds no line end before this
+  bool AtEnd_ = false;
+  bool Failed_ = false;
+};
 
 // KEY: a tonic (letter and accidental, no octave) and an optional "m" for minor; a
 // small letter also means minor, as in "c" for C minor.
@@ -89,14 +143,15 @@ int NameOneChord(CChordNamer& namer, CommandLine const& line) {
 }
 
 int NameChordsOfLines(CChordNamer& namer, bool json) {
-  std::ios::sync_with_stdio(false);
   // Someone watching a terminal sees each name at once; a pipe gets full blocks.
   bool const eachLine = isatty(STDOUT_FILENO) != 0;
-  std::string text, out;
+  CLineReader input;
+  std::string_view text;
+  std::string out;
   out.reserve(OutputBlock + 256);
   long lineNr = 0;
   int status = 0;
-  while (std::getline(std::cin, text)) {
+  while (input.Next(text)) {
     ++lineNr;
     std::string const problem = namer.NameLine(text, lineNr, json, out);
     if (!problem.empty()) {
@@ -110,7 +165,7 @@ int NameChordsOfLines(CChordNamer& namer, bool json) {
       out.clear();
     }
   }
-  if (std::cin.bad()) {
+  if (input.Failed()) {
     std::fputs("tonvex: cannot read the standard input\n", stderr);
     status = 1;
   }

@@ -39,7 +39,7 @@ bool IsDecimalNumber(std::string_view token) {
 TTokenProblem ReadNoteName(std::string_view token, CNote& note) {
   if (token.empty() || !IsLetter(token[0])) return Token_Unreadable;
   std::size_t i = 1;
-  if (token.compare(i, 2, "bb") == 0)
+  if (token.size() > 2 && token[1] == 'b' && token[2] == 'b')
     i += 2;
   else if (i < token.size() && (token[i] == 'b' || token[i] == 'x' || token[i] == '#'))
     ++i;

@@ -18,8 +18,9 @@ INPUT_TYPE Neuron::input_type = INPUT_SUM;
 
 namespace {
 
-// The flat-spot constant is a float literal in the trained nets' history; it is added
-// in double, so its widened value is what counts.
+// The flat-spot constant is the float 0.1 added in double, so its widened value
+// 0.10000000149011612 is what counts: the built-in net's weights were trained with
+// that derivative, and retraining must reproduce them.
 constexpr double FlatSpot = static_cast<double>(0.1f);
 
 std::size_t Count(int n) { return static_cast<std::size_t>(std::max(n, 0)); }

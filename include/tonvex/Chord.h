@@ -456,10 +456,11 @@ public:
   /// Code 14 (bVII) has a name but no chord gets it.
   int HarmFuncIn(CSignKey const& key) const;
   /// How close the chord lies to the key, 0..2, from a table per basic chord and key
-  /// mode indexed by the root's distance above the key's root. The tables are kept
-  /// as they have always been, surprising values included (in a major key a major
-  /// chord on the major third scores 2, diminished and augmented chords score 2
-  /// everywhere). For basic chord none the result is CountIntvlsInSignKey instead.
+  /// mode indexed by the root's distance above the key's root. The tables are fixed
+  /// answers that hosts rank chords by, surprising values included (in a major key
+  /// a major chord on the major third scores 2, diminished and augmented chords
+  /// score 2 everywhere). For basic chord none the result is CountIntvlsInSignKey
+  /// instead.
   int ClosenessToSignKey(CSignKey const& key) const;
   /// How many of the cached intervals lie in the key, each interval counted once by
   /// the note it stands for (IntvlIxToNote). An interval cached above the octave
@@ -545,7 +546,7 @@ public:
   /// Harmonic function name of HarmFuncIn(key): Roman ("IIm", "V", "VIIdim") or,
   /// with HarmFuncNaming 1, functional letters ("Sp", "D"), some by the key's mode
   /// ("III" is "TG" in a major key, "P" in a minor one). Code 0 is "undef". The
-  /// texts are kept as they have always been printed, unfinished-looking ones
+  /// texts are fixed output that hosts compare against, unfinished-looking ones
   /// included ("IIdim##", "VIIdim##in ks_min").
   std::string HarmFuncName(CSignKey key, CChordnamePref& pref) const;
 

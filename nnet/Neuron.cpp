@@ -43,7 +43,9 @@ float NetInput(float const* x, float const* w, int n, int weightCount) {
     return z;
   }
   case INPUT_PROD: {
-    if (terms <= 0) return 0.0f;
+    // Starts from x[0] * w[0] even when n is 0, as the minimum and maximum start
+    // from x[0]; a neuron without weights has no w[0].
+    if (weightCount <= 0) return 0.0f;
     float z = x[0] * w[0];
     for (int i = 1; i < terms; ++i) z *= x[i] * w[i];
     return z;

@@ -86,6 +86,10 @@ TEST_F(NeuronTest, NoInputs) {
   Params(INPUT_PROD, ACT_IDENT, OUTPUT_NONE, 1.0f, 0.0f);
   neuron.calcValue(&x, 1, &out, 0);
   EXPECT_EQ(out, 0.0f) << "no weight to multiply";
+  Neuron weighted(1);
+  weighted.weights[0] = 0.5f;
+  weighted.calcValue(&x, 0, &out, 0);
+  EXPECT_EQ(out, 2.0f) << "the product starts from x[0] * w[0] like the minimum";
 }
 
 TEST_F(NeuronTest, Activations) {

@@ -59,7 +59,7 @@ scaleoracle::SpellingTable ChordNoteSpellings(int pc, int e, int bc, bool minorS
   if (minorSecond) table.e[Mod12(pc + 1)] = table.e[Mod12(pc + 2)] - 1;
   for (int k = 0; k < 12; ++k) {
     if (oracle::Senseful(k, table.e[k])) continue;
-    EXPECT_EQ(table.e[k], Enh_Natural) << "root " << oracle::EnglishName(pc, e) << " key " << k;
+    EXPECT_EQ(table.e[k], Enh_Natural) << "root " << oracle::Name(pc, e) << " key " << k;
     table.e[k] = DefaultSpelling(k);
   }
   return table;
@@ -129,7 +129,7 @@ TEST(RootSpelling, FewestSignsForEveryRootSpellingAndBasicChord) {
         ASSERT_EQ(chord.BasicChord(), bc);
         chord.SetRootNoteEnhWithLeastSigns();
         int const expected = FewestSignsSpelling(k, e, bc);
-        EXPECT_EQ(chord.RootNote(), CNote(48 + k, E(expected))) << oracle::EnglishName(k, e) << " bc " << bc;
+        EXPECT_EQ(chord.RootNote(), CNote(48 + k, E(expected))) << oracle::Name(k, e) << " bc " << bc;
         EXPECT_TRUE(chord.RootNoteSpecified());
         kept += expected == e;
         toFlats += expected < e;
@@ -157,7 +157,7 @@ TEST(RootSpelling, FewestSignsExamples) {
   for (Case const& c : cases) {
     CChord chord(CNote(60 + c.k, E(c.e)), c.bc, 24);
     chord.SetRootNoteEnhWithLeastSigns();
-    EXPECT_EQ(chord.RootNote().Enh(), c.expected) << oracle::EnglishName(c.k, c.e);
+    EXPECT_EQ(chord.RootNote().Enh(), c.expected) << oracle::Name(c.k, c.e);
   }
 
   // A root spelled as no key can be (a triple flat from a scale on a double flat) is

@@ -325,7 +325,7 @@ TEST(NameForThisRootNote, EveryRootInEverySpelling) {
       CNote root = Given(k, e);
       int expected = oracle::Senseful(k, e) ? e : CMajorSpelling[k];
       CChord chord = TriadOn(k);
-      EXPECT_EQ(chord.NameForThisRootNote(root, DefaultChordnamePref), oracle::EnglishName(k, expected) + "  ")
+      EXPECT_EQ(chord.NameForThisRootNote(root, DefaultChordnamePref), oracle::Name(k, expected) + "  ")
           << k << " " << e;
       EXPECT_EQ(root.Enh(), expected) << k << " " << e;
       EXPECT_EQ(root.NoteNr(), 60 + k);
@@ -341,7 +341,7 @@ TEST(NameWithLeastSignsForThisRootNote, EveryRootKeepsItsCheckedSpelling) {
       int expected = Checked(k, e);
       ASSERT_GE(expected, 0) << k << " " << e;
       EXPECT_EQ(TriadOn(k).NameWithLeastSignsForThisRootNote(root, DefaultChordnamePref),
-                oracle::EnglishName(k, expected) + "  ")
+                oracle::Name(k, expected) + "  ")
           << k << " " << e;
       EXPECT_EQ(root.Enh(), expected) << k << " " << e;
     }

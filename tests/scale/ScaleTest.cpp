@@ -1,0 +1,202 @@
+// Scales: degrees and key numbers, snapping onto the scale and moving by degrees,
+// checked against models built on the scale's own list of key numbers, and the
+// spelling tables and sign counts against the letter model.
+#include "ScaleOracle.h"
+
+#include <tonvex/NoteNames.h>
+#include <tonvex/Scale.h>
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <climits>
+#include <cstdlib>
+
+namespace {
+
+using oracle::Mod12;
+TEnh E(int e) { return static_cast<TEnh>(e); }
+CScale::TType T(int type) { return static_cast<CScale::TType>(type); }
+
+// The scale's key numbers, by degree.
+std::vector<int> Keys(CScale const& scale) {
+  std::vector<int> keys;
+  for (int d = 0; d < scale.DegreesPerOctave(); ++d) keys.push_back(scale.DegreeNrToKeyNr(d));
+  return keys;
+}
+
+TEST(ScaleDegrees, EveryTypeAndRoot) {
+  for (int type : scaleoracle::TypeValues())
+    for (int root = 0; root < 12; ++root) {
+      CScale const scale(CNote(root, Enh_Natural), T(type));
+      std::vector<int> const keys = Keys(scale);
+      int const n = static_cast<int>(keys.size());
+      for (std::size_t d = 1; d < keys.size(); ++d) ASSERT_GT(Mod12(keys[d] - root), Mod12(keys[d - 1] - root));
+      for (int d = -3; d < 3 * n; ++d) {
+        int const expected = d < 0 ? root : keys[static_cast<std::size_t>(d % n)];
+        EXPECT_EQ(scale.DegreeNrToKeyNr(d), expected) << type << " " << root << " " << d;
+        EXPECT_EQ(scale.DegreeNrToKey(d).NoteNr(), expected);
+        EXPECT_TRUE(scale.DegreeNrToKey(d).HasSensefulEnh());
+      }
+      for (int k = -13; k <= 25; ++k) { // not reduced: 14 is no key number
+        auto const at = std::find(keys.begin(), keys.end(), k);
+        int const expected = at == keys.end() ? -1 : static_cast<int>(at - keys.begin());
+        EXPECT_EQ(scale.KeyNrToDegreeNr(k), expected) << type << " " << root << " " << k;
+        EXPECT_EQ(scale.HasKeyNr(k), expected >= 0);
+        EXPECT_TRUE(k < 0 || k > 11 || scale.NoteToDegreeNr(CNote(24 + k, Enh_Natural)) == expected);
+      }
+    }
+  CNote below(4, Enh_Natural);
+  below.SetOct(-2); // a negative key number is on no degree
+  EXPECT_EQ(CScale().NoteToDegreeNr(below), -1);
+}
+
+// The snap by its candidates: both start at the root r, so for 1..10 (and every k
+// outside 0..11) the lower one is r when r lies above k, else the highest key
+// number <= k, and the upper one is r when r lies below k, else the lowest key
+// number >= k. 11 looks up to C (if in the scale, else r) and down to the highest
+// key number; 0 looks down to B (if in the scale, else r) and up to the lowest.
+int Snapped(std::vector<int> const& keys, int root, int k, bool tieUp) {
+  auto has = [&](int key) { return std::find(keys.begin(), keys.end(), key) != keys.end(); };
+  if (has(k)) return k;
+  int const lowest = *std::min_element(keys.begin(), keys.end());
+  int const highest = *std::max_element(keys.begin(), keys.end());
+  int lower = root, upper = root;
+  if (k == 11) {
+    lower = highest;
+    upper = has(0) ? 0 : root;
+  } else if (k == 0) {
+    lower = has(11) ? 11 : root;
+    upper = lowest;
+  } else {
+    for (int key : keys) {
+      if (root <= k && key <= k) lower = std::max(lower, key);
+      if (root >= k && key >= k) upper = std::min(upper, key);
+    }
+  }
+  long long const toUpper = std::llabs(upper - static_cast<long long>(k));
+  long long const toLower = std::llabs(lower - static_cast<long long>(k));
+  return toUpper != toLower ? (toUpper < toLower ? upper : lower) : (tieUp ? upper : lower);
+}
+
+TEST(ScaleQuantize, EveryKeyNumberRootTypeAndDirection) {
+  std::vector<int> keyNrs = {INT_MIN, INT_MIN + 1, -1000000, 1000000, INT_MAX - 1, INT_MAX};
+  for (int k = -3; k <= 14; ++k) keyNrs.push_back(k);
+  for (int type : scaleoracle::TypeValues())
+    for (int root = 0; root < 12; ++root) {
+      CScale const scale(CNote(root, Enh_Natural), T(type));
+      for (int k : keyNrs)
+        for (int dir : {0, 1, 2, -1}) {
+          auto const direction = static_cast<CScale::TQuantizeToScaleDirection>(dir);
+          int const degree = scale.KeyNrQuantizeToDegreeNr(k, direction);
+          ASSERT_TRUE(degree >= 0 && degree < scale.DegreesPerOctave());
+          EXPECT_EQ(scale.DegreeNrToKeyNr(degree), Snapped(Keys(scale), root, k, dir == 0))
+              << type << " " << root << " " << k << " " << dir;
+          EXPECT_TRUE(k < 0 || k > 11 || scale.NoteQuantizeToDegreeNr(CNote(36 + k, Enh_Natural), direction) == degree);
+        }
+    }
+}
+
+// Moving a note of the scale by s degrees is the note s places further in the list
+// of the scale's notes; a note off the scale is first taken up to the next one.
+TEST(MoveInScale, StepsThroughTheScaleNotes) {
+  for (int type : scaleoracle::TypeValues())
+    for (scaleoracle::Root root : scaleoracle::Roots()) {
+      CScale const scale(CNote(root.k, E(root.e)), T(type));
+      std::vector<long> notes;
+      for (long n = 0; n <= 127; ++n)
+        if (scale.HasKeyNr(static_cast<int>(n % 12))) notes.push_back(n);
+      for (long n = 12; n <= 115; ++n) {
+        long const start = std::lower_bound(notes.begin(), notes.end(), n) - notes.begin();
+        for (int steps = -12; steps <= 12; ++steps) {
+          long const target = start + steps;
+          if (target < 0 || target >= static_cast<long>(notes.size()) || notes[static_cast<std::size_t>(target)] > 119)
+            continue;
+          long const expected = notes[static_cast<std::size_t>(target)];
+          ASSERT_EQ(scale.MoveInScale(CNote(n, Enh_Natural), steps),
+                    CNote(expected, scale.EnhForKeynr(static_cast<int>(expected % 12))))
+              << type << " " << root.k << " " << n << " " << steps;
+        }
+      }
+    }
+}
+
+TEST(MoveInScale, Edges) {
+  CScale const cSharp(CNote(1, Enh_Sharp), CScale::Scale_Major), aFlat(CNote(8, Enh_Flat), CScale::Scale_Major);
+  CScale const cMajor;
+  struct Case {
+    CScale const& scale;
+    long from;
+    int steps;
+    long to;
+  } const cases[] = {
+      {cSharp, 127, 0, 127},                       // no G# above 127: stays
+      {cSharp, 125, 3, 126},                       // as far as it can
+      {aFlat, 116, 7, 128},                        // the octave rule places G# at 128, where it stays
+      {aFlat, 116, 13, 128}, {cMajor, 64, -50, 0}, // far below: the walk down stops at 0
+      {cMajor, 64, 70, 112},                       // far above: octave 8
+      {cMajor, 255, 0, 112},                       // the undefined note from octave 20
+  };
+  for (Case const& c : cases)
+    EXPECT_EQ(c.scale.MoveInScale(CNote(c.from, Enh_Natural), c.steps).NoteNr(), c.to) << c.from << " " << c.steps;
+  for (int steps : {INT_MIN, -1000, 1000, INT_MAX})
+    for (long n : {0L, 127L, 255L}) EXPECT_TRUE(cMajor.HasNote(cMajor.MoveInScale(CNote(n, Enh_Natural), steps)));
+}
+
+TEST(ScaleSpelling, EveryRootSpellingAndTypeMatchesTheLetterModel) {
+  for (scaleoracle::Root root : scaleoracle::Roots())
+    for (int type : scaleoracle::TypeValues()) {
+      CScale const scale(CNote(48 + root.k, E(root.e)), T(type));
+      ASSERT_EQ(scale.RootNote(), CNote(root.k, E(root.e)));
+      scaleoracle::SpellingTable const expected = scaleoracle::Spellings(root, type);
+      for (int k = 0; k < 12; ++k)
+        EXPECT_EQ(scale.EnhForKeynr(k), expected.e[k]) << oracle::Name(root.k, root.e) << " " << type << " " << k;
+      EXPECT_EQ(scale.SignsCount(), oracle::SignCount(root.k, root.e, type == 2 ? 2 : 1));
+    }
+  // The root is a key number with a senseful spelling, whatever note is given.
+  CNote negative(61, Enh_Flat), sharpD(61, Enh_Sharp);
+  negative.SetOct(-3); // note -1
+  sharpD.SetNoteNr(62);
+  EXPECT_EQ(CScale(negative, CScale::Scale_Minor).RootNote(), CNote(0, Enh_Natural));
+  EXPECT_EQ(CScale(sharpD, CScale::Scale_Minor).RootNote(), CNote(2, Enh_Natural));
+  EXPECT_EQ(CScale(CNote_Undef, CScale::Scale_Minor).RootNote(), CNote(3, Enh_Flat));
+}
+
+// A note's spelling check falls back on the default scale, C major; AdjustEnhToScale
+// copies the entry of the pitch class without a check, for any note number.
+TEST(ScaleSpelling, DefaultScaleAndAdjustEnhToScale) {
+  for (int k = 0; k < 12; ++k) EXPECT_EQ(CScale().EnhForKeynr(k), scaleoracle::DefaultSpelling(k)) << k;
+  CScale const dbb(CNote(0, Enh_DoubleFlat), CScale::Scale_Major);
+  CNote low(11, Enh_Natural), high(11, Enh_Natural);
+  low.SetOct(-2);
+  high.SetOct(9);
+  for (CNote note : {low, high, CNote(0, Enh_Natural), CNote(56, Enh_Natural), CNote_Undef}) {
+    long const n = note.NoteNr();
+    note.AdjustEnhToScale(dbb);
+    EXPECT_EQ(note.Enh(), dbb.EnhForKeynr(Mod12(static_cast<int>(note.NoteNr())))) << n;
+    EXPECT_EQ(dbb.EnhForNote(note), note.Enh()) << n;
+  }
+  CNote aFlat(68, Enh_Flat);
+  aFlat.AdjustEnhToScale(dbb);
+  EXPECT_EQ(aFlat.Enh(), -1); // a triple flat, unchecked
+  EXPECT_EQ(aFlat.KeyName(DefaultChordnamePref), "G#");
+}
+
+TEST(ScaleSpelling, SettersAndTypeChanges) {
+  CScale scale(CNote(2, Enh_Natural), CScale::Scale_Major); // D major
+  scale.SetEnhForKeyNr(-11, Enh_DoubleSharp);               // key number 1
+  EXPECT_EQ(scale.EnhForKeynr(13), Enh_DoubleSharp);
+  scale.SetEnhForNote(CNote(63, Enh_Flat), E(7)); // stored unchecked
+  EXPECT_EQ(scale.EnhForKeynr(3), 7);
+  scale.SetEnhForChromStep(-3, Enh_Sharp); // B
+  EXPECT_EQ(scale.EnhForKeynr(11), Enh_Sharp);
+  scale.SetScaleType(CScale::Scale_Major); // the same type keeps the table
+  EXPECT_EQ(scale.EnhForKeynr(11), Enh_Sharp);
+  scale.SetScaleTypeWithoutCalcEnh(CScale::Scale_Minor);
+  EXPECT_EQ(scale.EnhForKeynr(11), Enh_Sharp);
+  scale.SetScaleType(CScale::Scale_Other); // another type recomputes it
+  EXPECT_EQ(scale.EnhForKeynr(11), Enh_Natural);
+  EXPECT_EQ(scale.ScaleType(), CScale::Scale_Other);
+}
+
+} // namespace

@@ -1,9 +1,11 @@
-// A chord in a key: harmonic function codes, closeness, the notes and intervals
+// A chord in a key: harmonic function codes and names, closeness, the notes and intervals
 // outside the key, for chords on every pitch class in every major and minor key,
 // read through the key's own list of degrees and the tables of chord/.
 #include "chord/ClosenessTables.h"
 #include "chord/HarmFuncCodes.h"
+#include "naming/HarmFuncNames.h"
 #include "support/ChordBuilders.h"
+#include "support/PrefGuard.h"
 
 #include <tonvex/Chord.h>
 #include <tonvex/SignKey.h>
@@ -31,6 +33,7 @@ CChord ChordOn(int pc, int bc) {
 }
 
 TEST(ChordInKey, FunctionAndClosenessOfEveryBasicChordOnEveryPitchClass) {
+  PrefGuard guard;
   for (CSignKey const& key : AllKeys()) {
     CScale const& scale = key.Scale();
     int const keyRoot = key.RootNote().KeyNr();
@@ -42,8 +45,12 @@ TEST(ChordInKey, FunctionAndClosenessOfEveryBasicChordOnEveryPitchClass) {
       for (int bc = CChord::bc_none; bc <= CChord::bc_drone; ++bc) {
         CChord const chord = ChordOn((keyRoot + distance) % 12, bc);
         ASSERT_EQ(chord.BasicChord(), bc);
-        EXPECT_EQ(chord.HarmFuncIn(key), degree < 0 ? 0 : HarmFuncCodes[degree][bc])
-            << key.Name(DefaultChordnamePref) << " " << distance << " " << bc;
+        int const code = degree < 0 ? 0 : HarmFuncCodes[degree][bc];
+        EXPECT_EQ(chord.HarmFuncIn(key), code) << key.Name(DefaultChordnamePref) << " " << distance << " " << bc;
+        for (int naming : {0, 1, 2}) { // only 1 names functions
+          CChordnamePref::HarmFuncNaming = naming;
+          EXPECT_EQ(chord.HarmFuncName(key, DefaultChordnamePref), HarmFuncText(code, naming == 1, major)) << naming;
+        }
         int const* closeness = ClosenessTable(bc, major);
         EXPECT_EQ(chord.ClosenessToSignKey(key), closeness ? closeness[distance] : chord.CountIntvlsInSignKey(key))
             << key.Name(DefaultChordnamePref) << " " << distance << " " << bc;

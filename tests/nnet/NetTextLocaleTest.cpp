@@ -1,5 +1,7 @@
 // The net's text files are written and read alike in every locale: a host may have
-// switched the process to one with a decimal comma, as German hosts do.
+// switched the process to one with a decimal comma, as German hosts do. The built-in
+// net, written as a property-and-weight list and as generated source, reads back
+// identical in the C locale and in German.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
 #include "training/ChordNetSource.h"
@@ -14,21 +16,23 @@
 
 namespace {
 
-class GermanLocale : public nettest::NetTest {
+class NetTextLocale : public nettest::NetTest, public ::testing::WithParamInterface<char const*> {
 protected:
   void SetUp() override {
-    if (!std::setlocale(LC_ALL, "de_DE.UTF-8")) GTEST_SKIP() << "the locale de_DE.UTF-8 is not installed";
-    std::locale::global(std::locale("de_DE.UTF-8"));
+    if (!std::setlocale(LC_ALL, GetParam())) GTEST_SKIP() << "the locale " << GetParam() << " is not installed";
+    std::locale::global(std::locale(GetParam()));
+  }
+  void TearDown() override { std::locale::global(std::locale::classic()); }
+};
+
+TEST_P(NetTextLocale, BuiltInNetReadsBackIdentical) {
+  if (std::string(GetParam()) != "C") {
     // What a reader or writer that followed the locale would do.
     std::ostringstream comma;
     comma << 84.8939;
     ASSERT_EQ(comma.str(), "84,8939");
     ASSERT_EQ(std::strtod("84.8939", nullptr), 84.0);
   }
-  void TearDown() override { std::locale::global(std::locale::classic()); }
-};
-
-TEST_F(GermanLocale, BuiltInNetReadsBackIdentical) {
   NeuronalNet net(ChordAnalysisNeuronalNet, weight_definitions);
   TempFile file;
   file.Write(net.weights_to_text(4, -1.0f, -1.0f, {}));
@@ -37,18 +41,19 @@ TEST_F(GermanLocale, BuiltInNetReadsBackIdentical) {
   TNetProp const props = NeuronalNet::load_net_properties_from_file(file.CPath());
   NeuronalNet fresh(props.fixed, props.dyn);
   fresh.load_weights_from_file(file.CPath());
-  EXPECT_NE(::testing::internal::GetCapturedStdout().find("weight 2, 84.893898\n"), std::string::npos);
+  std::string const printed = ::testing::internal::GetCapturedStdout();
+  EXPECT_NE(printed.find("weight 2, 84.893898\n"), std::string::npos);
+  EXPECT_NE(printed.find("weight 766, 0.000000\n"), std::string::npos); // after the final line break
   nettest::ExpectChordNetProperties(props.fixed, props.dyn);
   std::vector<float> const read = nettest::Weights(fresh);
   ASSERT_EQ(read.size(), 765u);
   EXPECT_EQ(std::memcmp(read.data(), weight_definitions, sizeof weight_definitions), 0);
-  // The generated source of the built-in net reads back as well.
   std::vector<float> const source = WeightsOfChordNetSource(ChordNetSource(net, ""));
   ASSERT_EQ(source.size(), 765u);
   EXPECT_EQ(std::memcmp(source.data(), weight_definitions, sizeof weight_definitions), 0);
 }
 
-TEST_F(GermanLocale, MessagesWriteAPoint) {
+TEST_P(NetTextLocale, MessagesWriteAPoint) {
   NeuronalNet net(nettest::Shape(2, {2}, 2));
   ::testing::internal::CaptureStdout();
   net.check_learn_data_for_duplicates({{{0.5f, 1}, {1, 0}, 0.1f, "a"}, {{0.5f, 1}, {0, 1}, 0.1f, "b"}});
@@ -57,5 +62,7 @@ TEST_F(GermanLocale, MessagesWriteAPoint) {
   EXPECT_NE(printed.find("Input: 0.500000 1.000000 \n"), std::string::npos) << printed;
   EXPECT_NE(printed.find("\nFehler: 0."), std::string::npos) << printed;
 }
+
+INSTANTIATE_TEST_SUITE_P(CAndGerman, NetTextLocale, ::testing::Values("C", "de_DE.UTF-8"));
 
 } // namespace

@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
@@ -15,8 +16,9 @@ class TempFile {
 public:
   explicit TempFile(std::string const& tag = "file") {
     ::testing::TestInfo const* info = ::testing::UnitTest::GetInstance()->current_test_info();
-    path_ = (std::filesystem::temp_directory_path() / ("tonvex_" + std::string(info->test_suite_name()) + "_" +
-                                                       info->name() + "_" + tag + "_" + std::to_string(::getpid())))
+    std::string name = std::string(info->test_suite_name()) + "_" + info->name(); // "/" in parameterised tests
+    std::replace(name.begin(), name.end(), '/', '_');
+    path_ = (std::filesystem::temp_directory_path() / ("tonvex_" + name + "_" + tag + "_" + std::to_string(::getpid())))
                 .string();
   }
   ~TempFile() {
@@ -28,7 +30,6 @@ public:
 
   std::string const& Path() const { return path_; }
   char const* CPath() const { return path_.c_str(); }
-
   void Write(std::string const& text) const { std::ofstream(path_, std::ios::binary) << text; }
   std::string Read() const {
     std::ifstream in(path_, std::ios::binary);

@@ -117,27 +117,6 @@ TEST(BasicChord, IntervalsAboveTheOctave) {
   }
 }
 
-// The oracles themselves against cases worked out by hand.
-TEST(BasicChord, WorkedCases) {
-  struct Case {
-    Intvls intvls;
-    int bc, xg;
-  } const cases[] = {{{0, 2, 4, 6, 7, 10}, C::bc_maj, 0},
-                     {{0, 4, 7, 8}, C::bc_maj, 0},
-                     {{0, 3, 6, 10}, C::bc_min, 11},
-                     {{0, 3, 8}, C::bc_none, 34},
-                     {{0, 3, 4, 7}, C::bc_maj, 0},
-                     {{0, 7, 10}, C::bc_none, 34},
-                     {{0, 2, 5, 7}, C::bc_sus4, 32},
-                     {{0, 7, 12}, C::bc_drone, 31},
-                     {{0}, C::bc_none, 30},
-                     {{}, C::bc_none, 34}};
-  for (Case const& c : cases) {
-    EXPECT_EQ(OracleBasicChord(c.intvls, 24), c.bc) << Describe(c.intvls);
-    EXPECT_EQ(OracleXG(c.intvls, 24), c.xg) << Describe(c.intvls);
-  }
-}
-
 // Built on an empty chord, every basic chord stands in the comping range 53..64,
 // one note per interval, and is recognised as itself.
 TEST(SetBasicChord, BuildsEveryBasicChordInTheCompingRange) {
@@ -201,34 +180,23 @@ TEST(SetBasicChord, MovesThirdsAndFifthsOfExistingNotes) {
   EXPECT_EQ(Members(none.IntvlSet()), (Intvls{0, 10}));
 }
 
-// The minor second of a chord is spelled as the lowered second degree: over every
-// root with at most one accidental, the letter after the root's letter.
-TEST(ChordScale, MinorSecondIsTheLoweredSecondDegree) {
+// The chord's scale is minor for minor and diminished chords, else major; its minor
+// second, when the chord has one, is the lowered second degree: the letter after the
+// root's letter. And the sign count of every root spelling and basic chord.
+TEST(ChordScaleAndSigns, EveryRootSpellingAndBasicChord) {
   for (int k = 0; k < 12; ++k)
     for (int e : oracle::SensefulSpellings(k))
-      for (C::TBasicChord bc : {C::bc_maj, C::bc_min}) {
-        if (e == 0 || e == 4) continue;
-        CChord chord(CNote(48 + k, static_cast<TEnh>(e)), bc, 24);
+      for (int bc = C::bc_none; bc <= C::bc_drone; ++bc) {
+        CChord chord(CNote(48 + k, static_cast<TEnh>(e)), static_cast<C::TBasicChord>(bc), 24);
+        EXPECT_EQ(chord.SignsCount(), oracle::SignCount(k, e, bc)) << k << " " << e << " " << bc;
         chord.AddIntvlInCompingRange(1);
         CScale const scale = chord.Scale();
-        EXPECT_EQ(scale.ScaleType(), bc == C::bc_min ? CScale::Scale_Minor : CScale::Scale_Major);
-        EXPECT_EQ(scale.RootNote(), CNote(k, static_cast<TEnh>(e)));
-        int const step = (k + 1) % 12;
-        auto const second = oracle::LetterFor(step, scale.EnhForKeynr(step));
-        ASSERT_TRUE(second.has_value()) << k << " " << e << " " << bc;
-        EXPECT_EQ(second->index, (oracle::LetterFor(k, e)->index + 1) % 7) << k << " " << e << " " << bc;
-      }
-  CChord chord = ChordOf({60, 64, 67});
-  EXPECT_EQ(chord.Scale().EnhForKeynr(1), Enh_Sharp); // without it, C major's C sharp
-}
-
-TEST(ChordSignsCount, EveryRootSpellingAndBasicChordCountsItsFifths) {
-  for (int k = 0; k < 12; ++k)
-    for (int e : oracle::SensefulSpellings(k))
-      for (int bc = C::bc_none; bc <= C::bc_drone; ++bc)
-        EXPECT_EQ(CChord(CNote(48 + k, static_cast<TEnh>(e)), static_cast<C::TBasicChord>(bc), 24).SignsCount(),
-                  oracle::SignCount(k, e, bc))
+        EXPECT_EQ(scale.ScaleType(), bc == C::bc_min || bc == C::bc_dim ? CScale::Scale_Minor : CScale::Scale_Major);
+        auto const second = oracle::LetterFor((k + 1) % 12, scale.EnhForKeynr((k + 1) % 12));
+        EXPECT_TRUE(e == 0 || e == 4 || (second && second->index == (oracle::LetterFor(k, e)->index + 1) % 7))
             << k << " " << e << " " << bc;
+      }
+  EXPECT_EQ(ChordOf({60, 64, 67}).Scale().EnhForKeynr(1), Enh_Sharp); // without it, C major's C sharp
   CNote root(60, Enh_Natural);
   root.SetNoteNr(61); // a natural spelling left on a black key
   CChord const chord(root, C::bc_maj, 24);

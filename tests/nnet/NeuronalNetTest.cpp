@@ -57,38 +57,28 @@ TEST_F(NeuronalNetTest, ForwardPassMatchesTheReferenceModel) {
   EXPECT_EQ(flat.get_outputs(), (std::vector<float>{sigmoid, sigmoid}));
 }
 
-// Both constructors draw one rand() per weight, layer by layer, and take the given
-// weights where there are any; building sets the Neuron statics for all nets.
+// Construction draws one rand() per weight, layer by layer, unless weights are
+// given; it sets the Neuron statics for all nets and makes counts valid (none below
+// 0, at most four hidden layers).
 TEST_F(NeuronalNetTest, Construction) {
-  int sizes[] = {4, 3};
-  std::srand(77);
-  NeuronalNet const byArguments(3, 2, sizes, 2, INPUT_SUM, ACT_SIGM, 0.5f, 1.0f, OUTPUT_NONE, 0.0f);
   std::srand(77);
   std::vector<float> expected;
   for (int i = 0; i < 4 * 3 + 3 * 4 + 2 * 3; ++i) {
     int const draw = std::rand() % 100;
     expected.push_back(draw == 0 ? 0.1f : static_cast<float>(draw) / 100.0f);
   }
-  NeuronalNet copy = byArguments;
-  EXPECT_EQ(Weights(copy), expected);
+  int sizes[] = {4, 3};
+  std::srand(77);
+  NeuronalNet drawn(3, 2, sizes, 2, INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f);
+  EXPECT_EQ(Weights(drawn), expected);
+  EXPECT_EQ(NeuronStatics(), std::make_tuple(INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f));
   std::vector<float> w(2 * 3 + 3 * 1, 0.5f);
   NeuronalNet given(Shape(2, {3}, 1, ACT_SIGM, 0.3f, 0.1f, w.data()));
   EXPECT_EQ(Weights(given), w);
-
-  Neuron::flat_spot_elimination = 0;
-  TPredefinedWeights r = Shape(2, {2}, 2, ACT_TANHYP, 0.25f, 1.5f);
-  r.dyn.neuron_prop = {INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f};
-  NeuronalNet net(r);
-  EXPECT_EQ(NeuronStatics(), std::make_tuple(INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f));
-  EXPECT_EQ(Neuron::flat_spot_elimination, 1);
-  net.enable_flat_spot_elimination(false);
-  EXPECT_EQ(Neuron::flat_spot_elimination, 0);
-  // Counts are made valid: none below 0, at most four hidden layers.
   TPredefinedWeights invalid = Shape(-2, {}, -1);
   invalid.dyn.hidden_layer_count = 7;
   for (int& size : invalid.dyn.hidden_layer_sizes) size = 2;
-  NeuronalNet valid(invalid);
-  TPredefinedWeights stored = valid.get_weights();
+  TPredefinedWeights stored = NeuronalNet(invalid).get_weights();
   delete[] stored.weights;
   EXPECT_TRUE(stored.fixed.input_count == 0 && stored.fixed.output_count == 0 && stored.dyn.hidden_layer_count == 4);
 }

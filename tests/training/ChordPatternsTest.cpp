@@ -87,40 +87,22 @@ TEST(ChordVoicings, EveryTypeRootInversionAndLayout) {
   EXPECT_EQ(at, voicings.size());
 }
 
+// Voicings of the four layouts and their names, found among all voicings.
 TEST(ChordVoicings, LayoutsAndNames) {
-  // The voicing of a type over a root, an inversion and a layout, by its place in the
-  // generator's order.
-  auto voicing = [voicings = ChordVoicings()](std::string const& name, int root, int inversion, int layout) {
-    std::size_t at = 0;
-    for (TChordPatternType const& type : ChordPatternTypes()) {
-      if (type.name == name)
-        return voicings.at(
-            at + (static_cast<std::size_t>(root) * type.intvls.size() + static_cast<std::size_t>(inversion)) * 4 +
-            static_cast<std::size_t>(layout));
-      at += 12 * 4 * type.intvls.size();
-    }
-    return TChordVoicing{};
-  };
-  struct Case {
-    char const* type;
-    int root, inversion, layout;
-    std::vector<int> notes;
-    char const* name;
-  } const cases[] = {{"major", 0, 0, 0, {36, 40, 43}, "C   (close)"},
-                     {"major", 0, 0, 1, {36, 40, 55}, "C   (open)"},
-                     {"major", 0, 2, 2, {43, 60, 64}, "C   / G (spread)"},
-                     {"major", 0, 0, 3, {24, 36, 40, 43, 48}, "C   (doubled)"},
-                     {"minor 7", 3, 1, 0, {42, 46, 49, 51}, "F#  6 (close)"}, // labelled from its bass
-                     {"major 6 added 9", 0, 1, 0, {40, 43, 45, 50, 60}, "C  6/9 / E (close)"},
-                     {"major j7 #11", 6, 0, 0, {42, 46, 49, 53, 60}, "F#  ma7/#11 (close)"},
-                     {"major 7 b5", 0, 1, 0, {40, 42, 46, 48}, "F#  7/b5 (close)"}, // from the nearer root
-                     {"single note", 9, 0, 3, {33, 45, 57}, "A no 3  (doubled)"},
-                     {"fifth", 10, 1, 2, {41, 58}, "Bb 5  / F (spread)"}};
-  for (Case const& c : cases) {
-    TChordVoicing const v = voicing(c.type, c.root, c.inversion, c.layout);
-    EXPECT_EQ(v.noteNrs, c.notes) << c.name;
-    EXPECT_EQ(v.name, c.name);
-  }
+  std::map<std::vector<int>, std::set<std::string>> names;
+  for (TChordVoicing const& v : ChordVoicings()) names[v.noteNrs].insert(v.name);
+  std::pair<std::vector<int>, char const*> const cases[] = {
+      {{36, 40, 43}, "C   (close)"},
+      {{36, 40, 55}, "C   (open)"},
+      {{43, 60, 64}, "C   / G (spread)"},
+      {{24, 36, 40, 43, 48}, "C   (doubled)"},
+      {{42, 46, 49, 51}, "F#  6 (close)"}, // E flat minor 7, labelled from its bass
+      {{40, 43, 45, 50, 60}, "C  6/9 / E (close)"},
+      {{42, 46, 49, 53, 60}, "F#  ma7/#11 (close)"},
+      {{40, 42, 46, 48}, "F#  7/b5 (close)"}, // C major 7 b5 over E, from the nearer root
+      {{33, 45, 57}, "A no 3  (doubled)"},
+      {{41, 58}, "Bb 5  / F (spread)"}};
+  for (auto const& [notes, name] : cases) EXPECT_EQ(names[notes].count(name), 1u) << name;
   EXPECT_EQ(ChordVoicingName({44, 60, 63, 66}, 20, "spread"), "Ab  7 (spread)"); // the root in the bass: no slash
 }
 

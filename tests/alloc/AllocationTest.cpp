@@ -2,15 +2,7 @@
 // gets back when the name is too long for the string's inline buffer. Allocations
 // are counted by the operator new of support/AllocationCounter.cpp.
 #include "support/AllocationCounter.h"
-#include <tonvex/Chord.h>
-#include <tonvex/ChordAnalysisNet.h>
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <cstdint>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

@@ -6,13 +6,7 @@
 #include "naming/HarmFuncNames.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-
-#include <tonvex/Chord.h>
-#include <tonvex/SignKey.h>
-
-#include <gtest/gtest.h>
-
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

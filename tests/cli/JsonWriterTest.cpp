@@ -1,11 +1,6 @@
 // The program's JSON writer: string escaping and the placing of commas.
 #include "JsonWriter.h"
-
-#include <gtest/gtest.h>
-
-#include <climits>
-#include <cstdio>
-#include <string>
+#include "support/TestPrelude.h"
 
 namespace {
 

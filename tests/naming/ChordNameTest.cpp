@@ -4,53 +4,45 @@
 #include "scale/ScaleOracle.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-
-#include <tonvex/Chord.h>
-
-#include <gtest/gtest.h>
-
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 
 using namespace chordtest;
 
-struct NameCase {
-  long root;
-  std::vector<long> notes;
-  char const *block, *plain, *slashed, *name; // BasicChordAndOptionsName, NameWithoutSlash, NameWithSlash, Name
-};
+// The block after the root, the name without and with a slash bass, and the name, each
+// between bars.
+std::string Names(CChord const& chord) {
+  return "|" + chord.BasicChordAndOptionsName(DefaultChordnamePref) + "|" +
+         chord.NameWithoutSlash(DefaultChordnamePref) + "|" + chord.NameWithSlash(DefaultChordnamePref) + "|" +
+         chord.Name(DefaultChordnamePref) + "|";
+}
 
 TEST(ChordName, DefaultPreferences) {
-  NameCase const cases[] = {{60, {60, 64, 67}, "  ", "C  ", "C  ", "C  "},
-                            {60, {60, 63, 67, 70}, " m 7", "C m 7", "C m 7", "C m 7"},
-                            {60, {60, 64, 67, 71}, "  ma7", "C  ma7", "C  ma7", "C  ma7"},
-                            {60, {60, 65, 67, 70}, " 7 sus 4", "C 7 sus 4", "C 7 sus 4", "C 7 sus 4"},
-                            {60, {60, 62, 67, 71}, " ma7 sus 2", "C ma7 sus 2", "C ma7 sus 2", "C ma7 sus 2"},
-                            {60, {60, 64, 68}, " aug ", "C aug ", "C aug ", "C aug "},
-                            {60, {60, 63, 66, 69}, " dim 7", "C dim 7", "C dim 7", "C dim 7"},
-                            {60, {60, 67}, " 5 ", "C 5 ", "C 5 ", "C 5 "},
-                            {60, {60, 63, 68}, " no 3 b3/#5", "C no 3 b3/#5", "C no 3 b3/#5", "C no 3 b3/#5"},
-                            {60, {60}, " no 3 ", "C", "C", "C"}, // the root alone
-                            // Narrow voicings show no slash, however inverted; wide ones a bass other than
-                            // the root, spelled by the chord's scale (a minor second as the lowered second).
-                            {60, {64, 67, 72}, "  ", "C  ", "C   / E", "C  "},
-                            {60, {48, 64, 67, 72}, "  ", "C  ", "C  ", "C  "},
-                            {60, {51, 60, 67, 72}, " m ", "C m ", "C m  / Eb", "C m  / Eb"},
-                            {60, {50, 60, 64, 67, 70}, "  7", "C  7", "C  7 / D", "C  7 / D"},
-                            {60, {49, 60, 64, 67}, "  ", "C  ", "C   / Db", "C   / Db"},
-                            {60, {54, 60, 64, 67, 70}, "  7", "C  7", "C  7 / F#", "C  7 / F#"},
-                            {66, {66, 69, 73}, " m ", "F# m ", "F# m ", "F# m "},
-                            {58, {58, 62, 65, 68}, "  7", "Bb  7", "Bb  7", "Bb  7"},
-                            {57, {60, 64, 67}, " m 7", "A m 7", "A m 7 / C", "A m 7"}}; // a root not among the notes
-  for (NameCase const& c : cases) {
-    CChord const chord = NotesThenRoot(Nat(c.root), c.notes);
-    EXPECT_EQ(chord.BasicChordAndOptionsName(DefaultChordnamePref), c.block) << ListLabel("notes", c.notes);
-    EXPECT_EQ(chord.NameWithoutSlash(DefaultChordnamePref), c.plain) << ListLabel("notes", c.notes);
-    EXPECT_EQ(chord.Name(DefaultChordnamePref), c.name) << ListLabel("notes", c.notes);
-    EXPECT_EQ(chord.NameWithSlash(DefaultChordnamePref), c.slashed) << ListLabel("notes", c.notes);
-  }
+  std::pair<std::vector<long>, char const*> const cases[] = {
+      {{60, 64, 67}, "|  |C  |C  |C  |"},
+      {{60, 63, 67, 70}, "| m 7|C m 7|C m 7|C m 7|"},
+      {{60, 64, 67, 71}, "|  ma7|C  ma7|C  ma7|C  ma7|"},
+      {{60, 65, 67, 70}, "| 7 sus 4|C 7 sus 4|C 7 sus 4|C 7 sus 4|"},
+      {{60, 62, 67, 71}, "| ma7 sus 2|C ma7 sus 2|C ma7 sus 2|C ma7 sus 2|"},
+      {{60, 64, 68}, "| aug |C aug |C aug |C aug |"},
+      {{60, 63, 66, 69}, "| dim 7|C dim 7|C dim 7|C dim 7|"},
+      {{60, 67}, "| 5 |C 5 |C 5 |C 5 |"},
+      {{60, 63, 68}, "| no 3 b3/#5|C no 3 b3/#5|C no 3 b3/#5|C no 3 b3/#5|"},
+      {{60}, "| no 3 |C|C|C|"}, // the root alone
+      // Narrow voicings show no slash, however inverted; wide ones a bass other than
+      // the root, spelled by the chord's scale (a minor second as the lowered second).
+      {{64, 67, 72}, "|  |C  |C   / E|C  |"},
+      {{48, 64, 67, 72}, "|  |C  |C  |C  |"},
+      {{51, 60, 67, 72}, "| m |C m |C m  / Eb|C m  / Eb|"},
+      {{50, 60, 64, 67, 70}, "|  7|C  7|C  7 / D|C  7 / D|"},
+      {{49, 60, 64, 67}, "|  |C  |C   / Db|C   / Db|"},
+      {{54, 60, 64, 67, 70}, "|  7|C  7|C  7 / F#|C  7 / F#|"},
+      {{60, 64, 67, 70, 74}, "|  7/9|C  7/9|C  7/9|C  7/9|"}};
+  for (auto const& [notes, names] : cases) EXPECT_EQ(Names(NotesThenRoot(Nat(60), notes)), names);
+  EXPECT_EQ(Names(NotesThenRoot(Nat(66), {66, 69, 73})), "| m |F# m |F# m |F# m |");
+  EXPECT_EQ(Names(NotesThenRoot(Nat(58), {58, 62, 65, 68})), "|  7|Bb  7|Bb  7|Bb  7|");
+  EXPECT_EQ(Names(NotesThenRoot(Nat(57), {60, 64, 67})), "| m 7|A m 7|A m 7 / C|A m 7|"); // a root not among the notes
   for (int bc : {8, 100, -1})
     EXPECT_EQ(BasicChordName(static_cast<CChord::TBasicChord>(bc), DefaultChordnamePref), "no 3");
 }
@@ -62,23 +54,19 @@ TEST(ChordName, Preferences) {
     long root;
     std::vector<long> notes;
     char const* name;
-  } const cases[] = {
-      {&CChordnamePref::ChordOptionSep, 1, 60, {60, 63, 67, 70, 74, 77}, "C m 7(9)(11)"},
-      {&CChordnamePref::SeparateBlocksInNames, 1, 60, {60, 65, 67, 70}, "C,7,sus 4"},
-      {&CChordnamePref::SeparateBlocksInNames, 1, 60, {52, 60, 67, 72}, "C,,,/ E"},
-      {&CChordnamePref::SeparateBlocksInNames, 5, 60, {60, 64, 67, 70, 74}, "C,,7/9"},
-      {&CChordnamePref::SeparateBlocksInNames, 1, 60, {60}, "C"},
-      {&CChordnamePref::MinorSmall, 1, 63, {63, 66, 70}, "eb m "},
-      {&CChordnamePref::MinorSmall, 1, 60, {60, 63, 66, 69}, "C dim 7"},
-      {&CChordnamePref::MinorSmall, 1, 60, {51, 60, 67, 72}, "c m  / Eb"},
-      {&CChordnamePref::NarrowChordsWithoutSlash, 0, 60, {64, 67, 72}, "C   / E"},
-      {&CChordnamePref::NarrowChordsWithoutSlash, 0, 60, {60, 64, 67}, "C  "},
-      {&CChordnamePref::Maj7ShownAs, 2, 60, {60, 63, 67, 71}, "C m maj7"},
-      {&CChordnamePref::OmitOptionOfLonelyLowestNoteInWideChord, 0, 60, {50, 60, 64, 67}, "C  add 9 / D"},
-      {&CChordnamePref::AccidentalsAsLetters, 1, 58, {50, 58, 65, 70}, "B   / D"},
-      {&CChordnamePref::AccidentalsAsLetters, 1, 61, {61, 64, 68}, "Cis m "},
-      {&CChordnamePref::RomanNames, 1, 69, {57, 60, 64, 67}, "La m 7"},
-      {&CChordnamePref::B_is_H, 1, 59, {47, 62, 66, 71}, "H m "}};
+  } const cases[] = {{&CChordnamePref::ChordOptionSep, 1, 60, {60, 63, 67, 70, 74, 77}, "C m 7(9)(11)"},
+                     {&CChordnamePref::SeparateBlocksInNames, 1, 60, {60, 65, 67, 70}, "C,7,sus 4"},
+                     {&CChordnamePref::SeparateBlocksInNames, 5, 60, {60, 64, 67, 70, 74}, "C,,7/9"},
+                     {&CChordnamePref::SeparateBlocksInNames, 1, 60, {60}, "C"},
+                     {&CChordnamePref::MinorSmall, 1, 63, {63, 66, 70}, "eb m "},
+                     {&CChordnamePref::MinorSmall, 1, 60, {60, 63, 66, 69}, "C dim 7"},
+                     {&CChordnamePref::MinorSmall, 1, 60, {51, 60, 67, 72}, "c m  / Eb"},
+                     {&CChordnamePref::NarrowChordsWithoutSlash, 0, 60, {60, 64, 67}, "C  "},
+                     {&CChordnamePref::Maj7ShownAs, 2, 60, {60, 63, 67, 71}, "C m maj7"},
+                     {&CChordnamePref::AccidentalsAsLetters, 1, 58, {50, 58, 65, 70}, "B   / D"},
+                     {&CChordnamePref::AccidentalsAsLetters, 1, 61, {61, 64, 68}, "Cis m "},
+                     {&CChordnamePref::RomanNames, 1, 69, {57, 60, 64, 67}, "La m 7"},
+                     {&CChordnamePref::B_is_H, 1, 59, {47, 62, 66, 71}, "H m "}};
   for (Case const& c : cases) {
     PrefGuard guard;
     *c.pref = c.value;

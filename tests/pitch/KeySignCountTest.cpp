@@ -1,10 +1,9 @@
 // The key sign count against the letter model: a key's signs are its tonic letter's
 // place on the circle of fifths plus seven per accidental.
 #include "support/SpellingOracle.h"
+#include "support/TestPrelude.h"
 
 #include "pitch/KeySignCount.h"
-
-#include <gtest/gtest.h>
 
 namespace {
 

@@ -2,14 +2,7 @@
 // from 0 to 40, copied and moved at every size): checked against std::set on random
 // operations, with values that own memory too, whose lifetimes the sanitizer and
 // memcheck runs watch.
-#include <tonvex/MySet.h>
-
-#include <gtest/gtest.h>
-
-#include <random>
-#include <set>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

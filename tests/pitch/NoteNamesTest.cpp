@@ -2,12 +2,7 @@
 // the letter model, and reading note names back.
 #include "support/PrefGuard.h"
 #include "support/SpellingOracle.h"
-
-#include <tonvex/NoteNames.h>
-
-#include <gtest/gtest.h>
-
-#include <string>
+#include "support/TestPrelude.h"
 
 namespace {
 

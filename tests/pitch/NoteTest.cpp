@@ -1,12 +1,6 @@
 // Notes: note numbers, octaves and distances; spelling against the letter model.
 #include "support/SpellingOracle.h"
-
-#include <tonvex/Note.h>
-
-#include <gtest/gtest.h>
-
-#include <cstdlib>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

@@ -5,8 +5,7 @@
 #define TONVEX_TESTS_SCALEORACLE_H
 
 #include "support/SpellingOracle.h"
-
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace scaleoracle {
 

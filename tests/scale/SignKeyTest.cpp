@@ -1,10 +1,7 @@
 // Keys: names in every naming style, types, sign counts and spellings.
 #include "ScaleOracle.h"
 #include "support/PrefGuard.h"
-
-#include <tonvex/SignKey.h>
-
-#include <gtest/gtest.h>
+#include "support/TestPrelude.h"
 
 namespace {
 

@@ -2,11 +2,7 @@
 #ifndef TONVEX_TESTS_CHORDBUILDERS_H
 #define TONVEX_TESTS_CHORDBUILDERS_H
 
-#include <tonvex/Chord.h>
-
-#include <set>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace chordtest {
 

@@ -3,9 +3,7 @@
 #ifndef TONVEX_TESTS_NEURONPARAMGUARD_H
 #define TONVEX_TESTS_NEURONPARAMGUARD_H
 
-#include <tonvex/Neuron.h>
-
-#include <tuple>
+#include "support/TestPrelude.h"
 
 /// The statics, in the order of the guard's copy.
 inline auto NeuronStaticsRefs() {

@@ -3,7 +3,7 @@
 #ifndef TONVEX_TESTS_PREFGUARD_H
 #define TONVEX_TESTS_PREFGUARD_H
 
-#include <tonvex/ChordnamePref.h>
+#include "support/TestPrelude.h"
 
 #include <array>
 

@@ -8,9 +8,8 @@
 #ifndef TONVEX_TESTS_SPELLINGORACLE_H
 #define TONVEX_TESTS_SPELLINGORACLE_H
 
+#include "support/TestPrelude.h"
 #include <optional>
-#include <string>
-#include <vector>
 
 namespace oracle {
 

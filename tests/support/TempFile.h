@@ -3,13 +3,11 @@
 #ifndef TONVEX_TESTS_TEMPFILE_H
 #define TONVEX_TESTS_TEMPFILE_H
 
-#include <gtest/gtest.h>
+#include "support/TestPrelude.h"
 
-#include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <string>
 #include <unistd.h>
 
 class TempFile {

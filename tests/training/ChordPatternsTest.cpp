@@ -4,17 +4,7 @@
 #include "training/ChordPatterns.h"
 #include "support/ChordBuilders.h"
 #include "support/NeuronParamGuard.h"
-
-#include <tonvex/ChordAnalysisNet.h>
-#include <tonvex/ChordTypes.h>
-
-#include <gtest/gtest.h>
-
-#include <algorithm>
-#include <map>
-#include <set>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 

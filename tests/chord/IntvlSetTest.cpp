@@ -143,15 +143,4 @@ TEST(IntvlSet, OperationsAndQueriesMatchAModel) {
   }
 }
 
-TEST(IntvlSet, OtherStackedThirdsOption) {
-  unsigned const thirds = 1u << 0 | 1u << 3 | 1u << 4 | 1u << 7;
-  for (unsigned mask = 0; mask < 4096; ++mask) {
-    CIntvlSet const set = FromMask(mask, 12);
-    for (int i = -1; i <= 12; ++i) {
-      unsigned const allowed = thirds | (i >= 0 && i < 12 ? 1u << i : 0u);
-      ASSERT_EQ(set.HasOtherStackedThirdsOptionThan(i), (mask & ~allowed) != 0) << mask << " " << i;
-    }
-  }
-}
-
 } // namespace

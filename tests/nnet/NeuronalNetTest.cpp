@@ -4,7 +4,7 @@
 #include "nnet/NetTestSupport.h"
 #include "support/TestPrelude.h"
 
-#include <functional>
+#include <cstddef>
 
 namespace {
 
@@ -75,29 +75,22 @@ TEST_F(NeuronalNetTest, WinnerAndInputVectors) {
   EXPECT_EQ(probe.get_outputs(), (std::vector<float>{7.0f, 4.0f})) << "missing values keep the last input";
 }
 
-// Weights are taken only from a record equal in every field (sizes beyond the hidden
-// layer count aside) with a weight array.
+// Weights are taken only from a record with a weight array and equal in every field
+// of its properties (each changed in turn here), but the hidden layer sizes beyond
+// the layer count.
 TEST_F(NeuronalNetTest, AcquireWeightsComparesEveryField) {
   NeuronalNet net(Shape(3, {2, 2}, 2, ACT_SIGM, 0.5f, 1.0f));
   std::vector<float> const before = Weights(net);
   std::vector<float> other(before.size(), 0.75f);
-  std::function<void(TPredefinedWeights&)> const edits[] = {
-      [](TPredefinedWeights& r) { r.fixed.input_count = 4; },
-      [](TPredefinedWeights& r) { r.fixed.output_count = 3; },
-      [](TPredefinedWeights& r) { r.dyn.hidden_layer_count = 1; },
-      [](TPredefinedWeights& r) { r.dyn.hidden_layer_sizes[1] = 1; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.input_type = INPUT_AVG; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.activation_type = ACT_LIN; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.activation_slope = 0.50001f; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.activation_threshold = -1.0f; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.output_type = OUTPUT_BIN; },
-      [](TPredefinedWeights& r) { r.dyn.neuron_prop.output_threshold = 1e-30f; },
-      [](TPredefinedWeights& r) { r.weights = nullptr; },
-      [](TPredefinedWeights& r) { r.dyn.hidden_layer_sizes[2] = 9; }}; // not compared: taken
-  for (std::size_t k = 0; k < std::size(edits); ++k) {
-    TPredefinedWeights record = Shape(3, {2, 2}, 2, ACT_SIGM, 0.5f, 1.0f, other.data());
-    edits[k](record);
-    bool const taken = k + 1 == std::size(edits);
+  std::size_t const fields = (sizeof(TFixedNetProp) + sizeof(TDynNetProp)) / sizeof(int);
+  std::size_t const unread = (sizeof(TFixedNetProp) + offsetof(TDynNetProp, hidden_layer_sizes)) / sizeof(int) + 2;
+  for (std::size_t k = 0; k <= fields; ++k) {
+    SetWeights(net, before);
+    TPredefinedWeights record = Shape(3, {2, 2}, 2, ACT_SIGM, 0.5f, 1.0f, k == fields ? nullptr : other.data());
+    int* field = k < sizeof(TFixedNetProp) / sizeof(int) ? reinterpret_cast<int*>(&record.fixed) + k
+                                                         : reinterpret_cast<int*>(&record.dyn) + k - 2;
+    if (k < fields) *field ^= 0x100;
+    bool const taken = k == unread || k == unread + 1;
     EXPECT_EQ(net.acquire_weights(record), taken) << k;
     EXPECT_EQ(Weights(net), taken ? other : before) << k;
   }

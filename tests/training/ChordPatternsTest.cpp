@@ -77,25 +77,6 @@ TEST(ChordVoicings, EveryTypeRootInversionAndLayout) {
   EXPECT_EQ(at, voicings.size());
 }
 
-// Voicings of the four layouts and their names, found among all voicings.
-TEST(ChordVoicings, LayoutsAndNames) {
-  std::map<std::vector<int>, std::set<std::string>> names;
-  for (TChordVoicing const& v : ChordVoicings()) names[v.noteNrs].insert(v.name);
-  std::pair<std::vector<int>, char const*> const cases[] = {
-      {{36, 40, 43}, "C   (close)"},
-      {{36, 40, 55}, "C   (open)"},
-      {{43, 60, 64}, "C   / G (spread)"},
-      {{24, 36, 40, 43, 48}, "C   (doubled)"},
-      {{42, 46, 49, 51}, "F#  6 (close)"}, // E flat minor 7, labelled from its bass
-      {{40, 43, 45, 50, 60}, "C  6/9 / E (close)"},
-      {{42, 46, 49, 53, 60}, "F#  ma7/#11 (close)"},
-      {{40, 42, 46, 48}, "F#  7/b5 (close)"}, // C major 7 b5 over E, from the nearer root
-      {{33, 45, 57}, "A no 3  (doubled)"},
-      {{41, 58}, "Bb 5  / F (spread)"}};
-  for (auto const& [notes, name] : cases) EXPECT_EQ(names[notes].count(name), 1u) << name;
-  EXPECT_EQ(ChordVoicingName({44, 60, 63, 66}, 20, "spread"), "Ab  7 (spread)"); // the root in the bass: no slash
-}
-
 // The sets several interpretations share, worked out by hand, are exactly the
 // ambiguous ones; the label follows the convention.
 TEST(ChordVoicings, AmbiguityAndLabels) {

@@ -33,11 +33,9 @@ TEST(ChordEdit, TransposeInvertAndLowestNote) {
   chord.Transpose(-10);
   EXPECT_TRUE(NoteNrs(chord) == (Notes{7, 50}) && chord.RootNote() == Nat(0));
   EXPECT_EQ(Members(chord.IntvlSet()), (Intvls{0, 7}));
-  Notes const inversions[][2] = {{{60, 64, 67}, {64, 67, 72}},
-                                 {{60, 70}, {70, 72}},
-                                 {{62, 72}, {72, 74}},
-                                 {{104, 119}, {116, 119}},
-                                 {{11, 127}, {127, 131}}};
+  Notes const inversions[][2] = {{{60, 64, 67}, {64, 67, 72}}, {{60, 70}, {70, 72}},
+                                 {{62, 72}, {72, 74}},         {{60, 72}, {72, 84}}, // equal pitch classes go up
+                                 {{104, 119}, {116, 119}},     {{11, 127}, {127, 131}}};
   for (auto const& c : inversions) {
     CChord inverted = ChordOf(c[0]);
     inverted.Invert();
@@ -73,7 +71,8 @@ TEST(ChordEdit, ChangeAllNotesWithinIntvlRange) {
     int lo, hi, to;
     Notes result;
     Intvls cache;
-  } const cases[] = {{{60, 64, 67}, 4, 4, 10, {58, 60, 67}, {0, 7, 10}},           // diff 6: down 6
+  } const cases[] = {{{60, 64, 67}, 4, 4, 9, {60, 67, 69}, {0, 7, 9}},             // diff 5: up
+                     {{60, 64, 67}, 4, 4, 10, {58, 60, 67}, {0, 7, 10}},           // diff 6: down 6
                      {{60, 64, 67}, 0, 0, 7, {53, 64, 67}, {4, 7}},                // diff 7: a fifth below
                      {{60, 64, 67, 74}, 1, 3, 0, {60, 64, 67, 72}, {0, 4, 7, 14}}, // 14 is not in 1..3
                      {{48, 60, 72}, 0, 0, 4, {52, 64, 76}, {4, 12}},               // every octave moves

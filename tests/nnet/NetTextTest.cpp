@@ -1,6 +1,5 @@
-// Text forms of a net and the two readers: the report and the property-and-weight
-// list as written, the sections by mode, reading back every function type, and what
-// the readers make of odd lines.
+// Text forms of a net and the two readers: the report, the recognition report and
+// the property-and-weight list as written, and what the readers make of odd lines.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
 #include "support/TestPrelude.h"
@@ -60,21 +59,6 @@ TEST_F(NetTextTest, ReportAndList) {
                       "pattern #1\nInputs: \n0.5, 0.25, \nOutputs: 0, 0.75, \nTelling Name: wrong\nstatic float"),
             std::string::npos)
       << text;
-}
-
-TEST_F(NetTextTest, SectionsByMode) {
-  NeuronalNet net = SmallNet();
-  char const* const markers[] = {"Network Properties\n", "The following ", "Neuron Connection Weights\n",
-                                 "static float weight_definitions[] =\n", "\t// Number Input Neurons\n"};
-  std::pair<int, char const*> const cases[] = {{-7, "1"},  {0, "13"}, {1, "13"}, {2, "14"},
-                                               {3, "124"}, {4, "25"}, {5, ""}};
-  for (auto const& [mode, sections] : cases) {
-    std::string const text = net.weights_to_text(mode, -1.0f, -1.0f, {});
-    for (char s = '1'; s <= '5'; ++s)
-      EXPECT_EQ(text.find(markers[s - '1']) != std::string::npos, std::string(sections).find(s) != std::string::npos)
-          << "mode " << mode << " section " << s;
-    EXPECT_EQ(text.find("Overall Error"), text.find("Cycles")); // neither, for -1
-  }
 }
 
 TNetProp ReadProperties(std::string const& text, std::string* printed = nullptr) {

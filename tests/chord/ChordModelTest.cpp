@@ -103,7 +103,6 @@ TEST(ChordTypes, CatalogueAndUserTypes) {
   EXPECT_EQ(types.ChordTypeBuiltInFromId(99), types.BuiltInTypes().end());
   EXPECT_TRUE(types.AddUserType(CChordType(1, "power", CIntvlSet(12, 0, 7, -1), -3)));
   EXPECT_FALSE(types.AddUserType(CChordType(1, "other", CIntvlSet(24, 0, -1), 0)));
-  EXPECT_TRUE(types.UserTypes().size() == 1 && types.ChordTypeUserFromId(1)->Tag() == -3);
   EXPECT_EQ(types.ChordTypeBuiltInFromId(1)->Name(), "major"); // the lists are searched apart
 }
 

@@ -1,12 +1,10 @@
 // Root finding and the small root operations. By rules, the scores and the choice of
 // the root are checked against a model written from their description: the weight
 // tables of chord/, the intervals computed from the notes' pitch classes, the special
-// chords, the tie and the distance rules. By net, what it evaluates with; how well
-// it names roots is measured by training.root_accuracy. Spelling is checked in
-// RootSpellingTest.cpp.
+// chords, the tie and the distance rules; how well the net names roots is measured
+// by training.root_accuracy. Spelling is checked in RootSpellingTest.cpp.
 #include "chord/RootWeights.h"
 #include "support/ChordBuilders.h"
-#include "support/NeuronParamGuard.h"
 #include "support/SpellingOracle.h"
 #include "support/TestPrelude.h"
 
@@ -141,32 +139,6 @@ TEST(RootFinding, LeavesTheCacheOfItsRoot) {
       ASSERT_EQ(Members(chord.IntvlSet()), Members(fresh.IntvlSet())) << mask << " " << algo;
       EXPECT_EQ(chord.LowestNoteLonely(), fresh.LowestNoteLonely()) << mask << " " << algo;
     }
-}
-
-// The root pitch class that root finding by net gives the note numbers; the chord's
-// wrap interval and its current root must not matter.
-long RootByNet(CMySet<int> const& noteNrs, int wrap = 24, long currentRoot = -1) {
-  CChord chord(wrap);
-  chord.SetFromNoteNrSet(noteNrs);
-  if (currentRoot >= 0) chord.SetRootNote(Nat(currentRoot));
-  chord.SetRootNoteAndEnh_ToLikeliestRegardingNoteSet(SCA_NEURONAL_NET);
-  EXPECT_TRUE(chord.RootNoteSpecified());
-  return chord.RootNote().NoteNr();
-}
-
-// The net evaluates with the process-wide neuron parameters as they stand: a net
-// built later changes its answers until the built-in properties are set again.
-TEST(RootFindingByNet, EvaluatesWithTheNeuronParametersAsTheyStand) {
-  NeuronParamGuard guard;
-  CMySet<int> const egc{64, 67, 72};
-  ASSERT_EQ(RootByNet(egc), 0);
-  {
-    // Outputs binarised at a threshold no sigmoid reaches: all 0, so output 0 wins.
-    NeuronalNet const other(2, 0, nullptr, 1, INPUT_SUM, ACT_SIGM, 0.2f, 2.0f, OUTPUT_BIN, 2.0f);
-  }
-  EXPECT_EQ(RootByNet(egc), 4); // the lowest note, E
-  NeuronalNet const builtIn(ChordAnalysisNeuronalNet);
-  EXPECT_EQ(RootByNet(egc), 0);
 }
 
 } // namespace

@@ -12,46 +12,31 @@
 
 namespace {
 
-// What a symbol keeps of a chord. The lead-sheet symbol also keeps the bass's
-// spelling; a Harte label spells the bass by its degree.
-struct CFacts {
-  long RootPc;
-  TEnh RootEnh;
-  unsigned PitchClasses;
-  long BassPc;
-  TEnh BassEnh;
-};
-
-CFacts FactsOf(CChord const& chord) {
-  CFacts facts{chord.RootNote().NoteNr() % 12, chord.RootNote().Enh(), 0, chord.LowestNote().NoteNr() % 12,
-               chord.LowestNote().Enh()};
-  for (CNote const& note : chord.Notes()) facts.PitchClasses |= 1u << (note.NoteNr() % 12);
-  return facts;
-}
-
-::testing::AssertionResult SameFacts(CFacts a, CFacts b, bool bassSpelling) {
-  if (a.RootPc == b.RootPc && a.RootEnh == b.RootEnh && a.PitchClasses == b.PitchClasses && a.BassPc == b.BassPc &&
-      (!bassSpelling || a.BassEnh == b.BassEnh))
-    return ::testing::AssertionSuccess();
-  return ::testing::AssertionFailure() << "root " << b.RootPc << "/" << b.RootEnh << " pitch classes " << b.PitchClasses
-                                       << " bass " << b.BassPc << "/" << b.BassEnh;
+// What a symbol keeps of a chord: root, pitch classes and bass, and the bass's
+// spelling in a lead-sheet symbol (a Harte label spells the bass by its degree).
+std::string Facts(CChord const& chord, bool bassSpelling) {
+  unsigned pitchClasses = 0;
+  for (CNote const& note : chord.Notes()) pitchClasses |= 1u << (note.NoteNr() % 12);
+  return "root " + std::to_string(chord.RootNote().NoteNr() % 12) + "/" + std::to_string(chord.RootNote().Enh()) +
+         " pitch classes " + std::to_string(pitchClasses) + " bass " +
+         std::to_string(chord.LowestNote().NoteNr() % 12) +
+         (bassSpelling ? "/" + std::to_string(chord.LowestNote().Enh()) : "");
 }
 
 // The symbol (plain, and in the given combination of style flags) and the label of
 // the chord read back to its facts and are written the same again.
 void ExpectRoundTrips(CChord const& chord, int style) {
-  CFacts const facts = FactsOf(chord);
   for (int s : {0, style}) {
     std::string const symbol = LeadSheetSymbol(chord, s);
     CChord read;
     ASSERT_TRUE(ReadChordSymbol(symbol, read)) << symbol;
-    ASSERT_TRUE(SameFacts(facts, FactsOf(read), true)) << symbol << " of " << HarteLabel(chord);
+    ASSERT_EQ(Facts(read, true), Facts(chord, true)) << symbol << " of " << HarteLabel(chord);
     ASSERT_EQ(LeadSheetSymbol(read, s), symbol);
   }
   std::string const label = HarteLabel(chord);
   CChord read;
   ASSERT_TRUE(ReadChordSymbol(label, read)) << label;
-  ASSERT_TRUE(SameFacts(facts, FactsOf(read), false)) << label << " of " << LeadSheetSymbol(chord);
+  ASSERT_EQ(Facts(read, false), Facts(chord, false)) << label << " of " << LeadSheetSymbol(chord);
   ASSERT_EQ(HarteLabel(read), label);
 }
 

@@ -39,7 +39,7 @@ TEST(ChordEdit, TransposeInvertAndLowestNote) {
   for (auto const& c : inversions) {
     CChord inverted = ChordOf(c[0]);
     inverted.Invert();
-    EXPECT_EQ(NoteNrs(inverted), c[1]) << ListLabel("notes", c[0]);
+    EXPECT_EQ(NoteNrs(inverted), c[1]) << ::testing::PrintToString(c[0]);
   }
   CChord lowest = ChordOf({60, 64, 67});
   lowest.SetLowestNote(Nat(65));

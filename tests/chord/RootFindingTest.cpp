@@ -68,7 +68,8 @@ struct Model {
 // The library's scores of all twelve pitch classes (a candidate counts by its pitch
 // class only) and its choice of root agree with the model.
 bool AgreesWithModel(CChord chord, Model const& model) {
-  std::string const what = ListLabel("pitch classes", model.pcs) + ", root " + std::to_string(model.root);
+  std::string const what =
+      "pitch classes " + ::testing::PrintToString(model.pcs) + ", root " + std::to_string(model.root);
   for (int pc = 0; pc < 12; ++pc) {
     EXPECT_EQ(chord.ProbThatNoteIsRootNote(CNote(pc, Enh_Natural)), model.Score(pc)) << what << ": " << pc;
     EXPECT_EQ(chord.ProbThatNoteIsRootNote(CNote(84 + pc, Enh_Sharp)), model.Score(pc)) << what << ": " << pc;

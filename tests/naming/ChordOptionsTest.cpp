@@ -95,7 +95,7 @@ TEST(ChordOptions, RulesUnderEveryBasicChordTheyMeet) {
                      {{0}, C::bc_none, ""}};
   for (Case const& c : cases) {
     CChord const chord = OverC(c.intvls);
-    std::string const label = ListLabel("intervals", c.intvls) + " bc " + std::to_string(c.bc);
+    std::string const label = ::testing::PrintToString(c.intvls) + " bc " + std::to_string(c.bc);
     EXPECT_EQ(Found(chord, c.bc), c.options) << label;
     if (chord.BasicChord() != c.bc) continue;
     // Recognised so: the same options through the public names, in both separators.

@@ -1,6 +1,7 @@
-// Net structure: construction, the flat weight order, the forward pass against the
-// reference model, winners, taking weights, copying and rebuilding.
-#include "nnet/NetReference.h"
+// Net structure: construction, the flat weight order, winners, taking weights,
+// copying and rebuilding. The forward pass is checked against the neurons' own
+// evaluation in PackedForwardTest.cpp and against the reference model in
+// NetTrainingTest.cpp.
 #include "nnet/NetTestSupport.h"
 #include "support/TestPrelude.h"
 
@@ -10,31 +11,6 @@ namespace {
 
 using namespace nettest;
 using NeuronalNetTest = NetTest;
-
-// The hidden layers ping-pong between buffers of varying sizes, where a wrong buffer
-// shows as wrong outputs.
-TEST_F(NeuronalNetTest, ForwardPassMatchesTheReferenceModel) {
-  std::srand(99);
-  for (std::vector<int> const& sizes : std::vector<std::vector<int>>{{2, 3, 1, 4, 2}, {3, 2, 5, 3, 4, 6}, {4, 6, 3}}) {
-    std::vector<int> const hidden(sizes.begin() + 1, sizes.end() - 1);
-    NeuronalNet net(Shape(sizes.front(), hidden, sizes.back(), ACT_SIGM, 0.7f, 0.4f));
-    TPredefinedWeights record = net.get_weights();
-    reference::Net const model(record);
-    delete[] record.weights;
-    for (int trial = 0; trial < 3; ++trial) {
-      std::vector<float> x;
-      for (int i = 0; i < sizes.front(); ++i) x.push_back(static_cast<float>((i + trial) % 3) - 0.5f);
-      net.use(x);
-      std::vector<double> const expected = model.Outputs(AsDouble(x));
-      for (std::size_t j = 0; j < expected.size(); ++j) EXPECT_NEAR(net.get_outputs()[j], expected[j], 1e-6) << j;
-    }
-  }
-  // Without hidden layers the output neurons have no inputs.
-  NeuronalNet flat(3, 0, nullptr, 2, INPUT_SUM, ACT_SIGM, 2.0f, 1.0f, OUTPUT_NONE, 0.0f);
-  flat.use({5.0f, -3.0f, 8.0f});
-  float const sigmoid = static_cast<float>(1.0 / (std::exp(2.0) + 1.0));
-  EXPECT_EQ(flat.get_outputs(), (std::vector<float>{sigmoid, sigmoid}));
-}
 
 // Construction draws one rand() per weight, layer by layer (rand() % 100 / 100, 0.1
 // for a 0: the ninth draw after srand(7)), unless weights are given; it sets the

@@ -44,14 +44,6 @@ inline CChord OverC(std::vector<int> const& intvls) {
   return NotesThenRoot(Nat(60), noteNrs);
 }
 
-/// "prefix v1 v2 ..." for failure messages.
-template <class T>
-std::string ListLabel(char const* prefix, std::vector<T> const& values) {
-  std::string label = prefix;
-  for (T v : values) label += " " + std::to_string(v);
-  return label;
-}
-
 inline std::vector<long> NoteNrs(CChord const& chord) {
   std::vector<long> nrs;
   for (CNote const& n : chord.Notes()) nrs.push_back(n.NoteNr());

@@ -14,9 +14,6 @@ inline auto NeuronStaticsRefs() {
 
 class NeuronParamGuard {
 public:
-  NeuronParamGuard() = default;
-  NeuronParamGuard(NeuronParamGuard const&) = delete;
-  NeuronParamGuard& operator=(NeuronParamGuard const&) = delete;
   ~NeuronParamGuard() { NeuronStaticsRefs() = saved_; }
 
 private:

@@ -15,15 +15,12 @@ inline auto NamingPrefRefs() {
 }
 
 template <class... T>
-std::tuple<std::remove_reference_t<T>...> Copied(std::tuple<T...> const& refs) {
+std::tuple<T...> Copied(std::tuple<T&...> const& refs) {
   return refs;
 }
 
 class PrefGuard {
 public:
-  PrefGuard() = default;
-  PrefGuard(PrefGuard const&) = delete;
-  PrefGuard& operator=(PrefGuard const&) = delete;
   ~PrefGuard() { NamingPrefRefs() = saved_; }
 
   /// Sets the four note-naming flags at once.

@@ -23,8 +23,6 @@ public:
     std::error_code ignored;
     std::filesystem::remove(path_, ignored);
   }
-  TempFile(TempFile const&) = delete;
-  TempFile& operator=(TempFile const&) = delete;
 
   std::string const& Path() const { return path_; }
   char const* CPath() const { return path_.c_str(); }

@@ -74,9 +74,7 @@ TEST(RootByNetTables, EveryPatternOverEveryLowestNoteAsTheNetAndTheSpellingsGive
 
 // Another net built since the library's own replaces the Neuron parameters: root
 // finding then follows the forward pass under those parameters, which a net with the
-// built-in weights gives, on the fast path and on the reference path alike. The
-// last set differs only in a value this net never reads, so its winners are the
-// built-in ones, now from the forward pass.
+// built-in weights gives, on the fast path and on the reference path alike.
 TEST(RootByNetTables, OtherNeuronParametersFollowTheForwardPass) {
   NeuronParamGuard guard;
   NeuronalNet net(ChordAnalysisNeuronalNet);
@@ -88,11 +86,9 @@ TEST(RootByNetTables, OtherNeuronParametersFollowTheForwardPass) {
     float slope, threshold;
     OUTPUT_TYPE output;
     float outputThreshold;
-    bool changesWinners;
-  } const paramSets[] = {{INPUT_SUM, ACT_SIGM, 0.05f, 2.0f, OUTPUT_NONE, 0.0f, true},
-                         {INPUT_AVG, ACT_TANHYP, 0.2f, 0.5f, OUTPUT_NONE, 0.0f, true},
-                         {INPUT_SUM, ACT_SIGM, 0.2f, 2.0f, OUTPUT_BIN, 0.999f, true},
-                         {INPUT_SUM, ACT_SIGM, 0.2f, 2.0f, OUTPUT_NONE, 0.5f, false}};
+  } const paramSets[] = {{INPUT_SUM, ACT_SIGM, 0.05f, 2.0f, OUTPUT_NONE, 0.0f},
+                         {INPUT_AVG, ACT_TANHYP, 0.2f, 0.5f, OUTPUT_NONE, 0.0f},
+                         {INPUT_SUM, ACT_SIGM, 0.2f, 2.0f, OUTPUT_BIN, 0.999f}};
   for (CParams const& p : paramSets) {
     int hidden[] = {2};
     NeuronalNet other(3, 1, hidden, 2, p.input, p.activation, p.slope, p.threshold, p.output, p.outputThreshold);
@@ -106,7 +102,7 @@ TEST(RootByNetTables, OtherNeuronParametersFollowTheForwardPass) {
       ASSERT_EQ(chord.RootNote().NoteNr(), (lowest + winner) % 12)
           << "pattern " << pattern << " activation " << p.activation << " slope " << p.slope;
     }
-    EXPECT_EQ(changed > 0, p.changesWinners) << changed;
+    EXPECT_GT(changed, 0) << "the parameters change no winner"; // else the tables would do
   }
 }
 

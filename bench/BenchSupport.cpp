@@ -1,6 +1,6 @@
 #include "BenchSupport.h"
 
-#include "support/Voicings.h"
+#include "Voicings.h"
 
 std::vector<CMySet<int>> const& Voicings() {
   static std::vector<CMySet<int>> const voicings = MakeVoicings();

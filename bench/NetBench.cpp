@@ -1,6 +1,6 @@
 // The forward pass of a net of the built-in net's shape and weights.
 #include "BenchSupport.h"
-#include "support/Voicings.h"
+#include "Voicings.h"
 #include <tonvex/ChordAnalysisNet.h>
 #include <tonvex/NeuronalNet.h>
 

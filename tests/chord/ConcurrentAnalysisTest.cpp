@@ -1,7 +1,7 @@
 // Root finding and naming keep no state outside the chord they work on: threads
 // that analyse chords at the same time get the answers one thread gets alone. The
 // ThreadSanitizer build (.ci/run) runs this test to find any data race on the way.
-#include "support/Voicings.h"
+#include "support/PitchClassVoicings.h"
 #include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
@@ -35,7 +35,7 @@ CAnswer Analyse(CChord& chord, CMySet<int> const& voicing, TSingleChordAnalysisA
 }
 
 TEST(ConcurrentAnalysis, EightThreadsGetTheAnswersOfOne) {
-  std::vector<CMySet<int>> const voicings = MakeVoicings();
+  std::vector<CMySet<int>> const voicings = PitchClassVoicings();
   std::size_t const count = voicings.size();
   std::vector<CAnswer> expected;
   CChord chord(24);

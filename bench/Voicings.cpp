@@ -1,4 +1,4 @@
-#include "support/Voicings.h"
+#include "Voicings.h"
 
 namespace {
 

@@ -1,6 +1,6 @@
-// Scales: degrees and key numbers, snapping onto the scale and moving by degrees,
-// checked against models built on the scale's own list of key numbers, and the
-// spelling tables and sign counts against the letter model.
+// Scales and keys: degrees and key numbers, snapping onto the scale and moving by
+// degrees, checked against models built on the scale's own list of key numbers, and
+// the spelling tables, sign counts and key names against the letter model.
 #include "ScaleOracle.h"
 #include "support/TestPrelude.h"
 
@@ -130,6 +130,24 @@ TEST(ScaleSpelling, EveryRootSpellingAndTypeMatchesTheLetterModel) {
   EXPECT_EQ(CScale(negative, CScale::Scale_Minor).RootNote(), CNote(0, Enh_Natural));
   EXPECT_EQ(CScale(sharpD, CScale::Scale_Minor).RootNote(), CNote(2, Enh_Natural));
   EXPECT_EQ(CScale(CNote_Undef, CScale::Scale_Minor).RootNote(), CNote(3, Enh_Flat));
+}
+
+// Only type 1 is major; the key's scale is the major or minor scale on its root,
+// which is taken as a key number; setting the type keeps the root and spells the
+// scale anew. The name is the root's (checked in every naming style in
+// NoteNamesTest.cpp), with "m" for minor.
+TEST(SignKey, EveryRootAndType) {
+  for (scaleoracle::Root root : scaleoracle::Roots())
+    for (int type : {-1, 0, 1, 2, 8}) {
+      int const scaleType = type == 1 ? 1 : 2;
+      CSignKey key(CNote(36 + root.k, E(root.e)), static_cast<CSignKey::TType>(3 - scaleType));
+      key.SetSignKeyType(static_cast<CSignKey::TType>(type));
+      EXPECT_TRUE(key.SignKeyType() == scaleType && key.RootNote() == CNote(root.k, E(root.e))) << type;
+      EXPECT_EQ(key.SignsCount(), oracle::SignCount(root.k, root.e, scaleType));
+      scaleoracle::SpellingTable const spellings = scaleoracle::Spellings(root, scaleType);
+      for (int pc = 0; pc < 12; ++pc) EXPECT_EQ(key.Scale().EnhForKeynr(pc), spellings.e[pc]);
+      EXPECT_EQ(key.Name(DefaultChordnamePref), oracle::Name(root.k, root.e) + (type == 1 ? "" : "m"));
+    }
 }
 
 } // namespace

@@ -1,10 +1,9 @@
-// Basic chord recognition, reshaping into a basic chord, the chord's scale, the XG
-// chord type and the key sign count of a chord. Expectations come from the
-// recognition rules written out as a first-match list, from the XG rows of the
-// training-pattern generator (a table of its own, in XGChordIx's order) and from the
-// letter model.
+// Basic chord recognition, reshaping into a basic chord and the XG chord type.
+// Expectations come from the recognition rules written out as a first-match list and
+// from the XG rows of the training-pattern generator (a table of its own, in
+// XGChordIx's order). Chords built from a basic chord are checked in
+// RootSpellingTest.cpp.
 #include "support/ChordBuilders.h"
-#include "support/SpellingOracle.h"
 #include "support/TestPrelude.h"
 #include "training/ChordPatterns.h"
 
@@ -127,41 +126,6 @@ TEST(SetBasicChord, MovesThirdsAndFifthsOfExistingNotes) {
   drone.SetBasicChord(C::bc_drone);
   EXPECT_EQ(NoteNrs(drone), (std::vector<long>{48, 55, 67, 91}));
   EXPECT_EQ(Members(drone.IntvlSet()), (Intvls{0, 7, 12}));
-}
-
-// Built on an empty chord, every basic chord on every root spelling (in octaves 0
-// to 5) stands in the comping range 53..64, one note per interval, and is
-// recognised as itself. Its scale is minor for minor and diminished chords, else
-// major; its minor second, when the chord has one, is the lowered second degree: the
-// letter after the root's letter. And its sign count.
-TEST(SetBasicChord, EveryBasicChordOnEveryRootSpelling) {
-  for (int k = 0; k < 12; ++k)
-    for (int e : oracle::SensefulSpellings(k))
-      for (int bc = C::bc_none; bc <= C::bc_drone; ++bc) {
-        std::string const what = oracle::Name(k, e) + " " + std::to_string(bc);
-        CChord chord(CNote(k + 12 * (k % 6), static_cast<TEnh>(e)), static_cast<C::TBasicChord>(bc), 24);
-        Intvls const cache = Members(chord.IntvlSet());
-        EXPECT_TRUE(chord.BasicChord() == bc && chord.RootNoteSpecified() && chord.NoteCount() == cache.size() &&
-                    Members(chord.IntvlsInBasicChord()) == cache && chord.IntvlsInBasicChord().WrapIntvl() == 24)
-            << what;
-        for (CNote const& n : chord.Notes())
-          EXPECT_TRUE(n.NoteNr() >= 53 && n.NoteNr() <= 64 && n.HasSensefulEnh() &&
-                      cache.count(oracle::Mod12(n.KeyNr() - k)))
-              << what << " " << n;
-        EXPECT_EQ(chord.SignsCount(), oracle::SignCount(k, e, bc)) << what;
-        chord.AddIntvlInCompingRange(1);
-        CScale const scale = chord.Scale();
-        int const minor = bc == C::bc_min || bc == C::bc_dim ? CScale::Scale_Minor : CScale::Scale_Major;
-        EXPECT_TRUE(scale.ScaleType() == minor && chord.ScaleType() == minor) << what;
-        auto const second = oracle::LetterFor((k + 1) % 12, scale.EnhForKeynr((k + 1) % 12));
-        EXPECT_TRUE(e == 0 || e == 4 || (second && second->index == (oracle::LetterFor(k, e)->index + 1) % 7)) << what;
-      }
-  EXPECT_EQ(ChordOf({60, 64, 67}).Scale().EnhForKeynr(1), Enh_Sharp); // without it, C major's C sharp
-  CNote root(60, Enh_Natural);
-  root.SetNoteNr(61); // a natural spelling left on a black key
-  CChord const chord(root, C::bc_maj, 24);
-  EXPECT_EQ(chord.SignsCount(), -5); // respelled as D flat
-  EXPECT_EQ(chord.RootNote(), CNote(61, Enh_Flat));
 }
 
 } // namespace

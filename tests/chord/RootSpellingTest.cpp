@@ -1,6 +1,7 @@
 // Spelling after root finding: the root's spelling with the fewest key-signature signs
-// and the notes spelled after the root's scale, against the letter model and the
-// letter-built scales.
+// and the notes spelled after the root's scale; chords built on every root spelling:
+// their notes, scale and sign count. Against the letter model and the letter-built
+// scales.
 #include "scale/ScaleOracle.h"
 #include "support/ChordBuilders.h"
 #include "support/TestPrelude.h"
@@ -69,16 +70,44 @@ TEST(RootSpelling, EveryPitchClassSetAfterRootFinding) {
   }
 }
 
-TEST(RootSpelling, FewestSignsForEveryRootSpellingAndBasicChord) {
+// Built on an empty chord, every basic chord on every root spelling (in octaves 0
+// to 5) stands in the comping range 53..64, one note per interval, and is
+// recognised as itself. Its scale is minor for minor and diminished chords, else
+// major; its minor second, when the chord has one, is the lowered second degree: the
+// letter after the root's letter. And its sign count and root spelling with the
+// fewest signs.
+TEST(ChordOnEveryRootSpelling, BasicChordScaleAndSigns) {
   for (int k = 0; k < 12; ++k)
     for (int e : oracle::SensefulSpellings(k))
       for (int bc = CChord::bc_none; bc <= CChord::bc_drone; ++bc) {
-        CChord chord(CNote(48 + k, static_cast<TEnh>(e)), static_cast<CChord::TBasicChord>(bc), 24);
+        std::string const what = oracle::Name(k, e) + " " + std::to_string(bc);
+        CChord chord(CNote(k + 12 * (k % 6), static_cast<TEnh>(e)), static_cast<CChord::TBasicChord>(bc), 24);
+        Intvls const cache = Members(chord.IntvlSet());
+        EXPECT_TRUE(chord.BasicChord() == bc && chord.RootNoteSpecified() && chord.NoteCount() == cache.size() &&
+                    Members(chord.IntvlsInBasicChord()) == cache && chord.IntvlsInBasicChord().WrapIntvl() == 24)
+            << what;
+        for (CNote const& n : chord.Notes())
+          EXPECT_TRUE(n.NoteNr() >= 53 && n.NoteNr() <= 64 && n.HasSensefulEnh() &&
+                      cache.count(oracle::Mod12(n.KeyNr() - k)))
+              << what << " " << n;
+        EXPECT_EQ(chord.SignsCount(), oracle::SignCount(k, e, bc)) << what;
+        chord.AddIntvlInCompingRange(1);
+        CScale const scale = chord.Scale();
+        int const minor = bc == CChord::bc_min || bc == CChord::bc_dim ? CScale::Scale_Minor : CScale::Scale_Major;
+        EXPECT_TRUE(scale.ScaleType() == minor && chord.ScaleType() == minor) << what;
+        auto const second = oracle::LetterFor((k + 1) % 12, scale.EnhForKeynr((k + 1) % 12));
+        EXPECT_TRUE(e == 0 || e == 4 || (second && second->index == (oracle::LetterFor(k, e)->index + 1) % 7)) << what;
         chord.SetRootNoteEnhWithLeastSigns();
-        EXPECT_EQ(chord.RootNote(), CNote(48 + k, static_cast<TEnh>(FewestSignsSpelling(k, e, bc))))
-            << oracle::Name(k, e) << " " << bc;
-        EXPECT_TRUE(chord.RootNoteSpecified());
+        EXPECT_TRUE(chord.RootNote() == CNote(k + 12 * (k % 6), static_cast<TEnh>(FewestSignsSpelling(k, e, bc))) &&
+                    chord.RootNoteSpecified())
+            << what;
       }
+  EXPECT_EQ(ChordOf({60, 64, 67}).Scale().EnhForKeynr(1), Enh_Sharp); // without it, C major's C sharp
+  CNote root(60, Enh_Natural);
+  root.SetNoteNr(61); // a natural spelling left on a black key
+  CChord const natural(root, CChord::bc_maj, 24);
+  EXPECT_EQ(natural.SignsCount(), -5); // respelled as D flat
+  EXPECT_EQ(natural.RootNote(), CNote(61, Enh_Flat));
   // A root spelled as no key can be (a triple flat from a scale on a double flat) is
   // corrected first: to G#, whose major chord then goes to Ab.
   CNote tripleFlat(56, Enh_Natural);

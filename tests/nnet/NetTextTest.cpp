@@ -4,18 +4,15 @@
 #include "support/TempFile.h"
 #include "support/TestPrelude.h"
 
-#include <regex>
-
 namespace {
 
 using namespace nettest;
 using NetTextTest = NetTest;
 
-// The text after the time line and the two line ends that follow it.
+// The text after the time line (its format is checked with the training log's)
+// and the two line ends that follow it.
 std::string Body(std::string const& text) {
   std::size_t const end = text.find('\n');
-  EXPECT_TRUE(std::regex_match(text.substr(0, end), std::regex("[A-Z][a-z]{2} [A-Z][a-z]{2} [ 0-9][0-9] "
-                                                               "[0-9]{2}:[0-9]{2}:[0-9]{2} [0-9]{4}")));
   EXPECT_EQ(text.compare(end, 3, "\n\n\n"), 0);
   return text.substr(end + 3);
 }

@@ -49,12 +49,6 @@ inline void SetWeights(NeuronalNet& net, std::vector<float> weights) {
   ASSERT_TRUE(WeightCount(r) == weights.size() && net.acquire_weights(r));
 }
 
-/// The Neuron function statics in the order of TNeuronProp.
-inline auto NeuronStatics() {
-  return std::make_tuple(Neuron::input_type, Neuron::activation_type, Neuron::activation_slope,
-                         Neuron::activation_threshold, Neuron::output_type, Neuron::output_threshold);
-}
-
 inline std::vector<double> AsDouble(std::vector<float> const& v) { return std::vector<double>(v.begin(), v.end()); }
 
 } // namespace nettest

@@ -114,7 +114,8 @@ TEST_F(NeuronTest, Derivatives) {
 // elimination back on. (Start weights are checked with a net's in NeuronalNetTest.)
 TEST_F(NeuronTest, Statics) {
   Params(INPUT_AVG, ACT_TANHYP, OUTPUT_BIN, 0.25f, 3.0f, 0.75f);
-  EXPECT_EQ(nettest::NeuronStatics(), std::make_tuple(INPUT_AVG, ACT_TANHYP, 0.25f, 3.0f, OUTPUT_BIN, 0.75f));
+  EXPECT_EQ(NeuronStatics(), std::make_tuple(INPUT_AVG, ACT_TANHYP, 0.25f, 3.0f, OUTPUT_BIN, 0.75f,
+                                             (OUTPUT_BIN * 4 + ACT_TANHYP) * 5 + INPUT_AVG, 1));
   for (int c = 0; c < 40; ++c) {
     Params(c % 5, c / 5 % 4, c / 20, 1, 0);
     EXPECT_EQ(Neuron::combined_type, c);

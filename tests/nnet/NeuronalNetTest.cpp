@@ -26,7 +26,8 @@ TEST_F(NeuronalNetTest, Construction) {
   std::srand(7);
   NeuronalNet drawn(3, 2, sizes, 2, INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f);
   EXPECT_EQ(Weights(drawn), expected);
-  EXPECT_EQ(NeuronStatics(), std::make_tuple(INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f));
+  EXPECT_EQ(NeuronStatics(), std::make_tuple(INPUT_MAX, ACT_TANHYP, 0.25f, 1.5f, OUTPUT_BIN, 0.125f,
+                                             (OUTPUT_BIN * 4 + ACT_TANHYP) * 5 + INPUT_MAX, 1));
   std::vector<float> w(2 * 3 + 3 * 1, 0.5f);
   NeuronalNet given(Shape(2, {3}, 1, ACT_SIGM, 0.3f, 0.1f, w.data()));
   EXPECT_EQ(Weights(given), w);

@@ -5,19 +5,19 @@
 
 #include "support/TestPrelude.h"
 
-/// The statics, in the order of the guard's copy.
-inline auto NeuronStaticsRefs() {
-  return std::tie(Neuron::flat_spot_elimination, Neuron::activation_threshold, Neuron::activation_slope,
-                  Neuron::output_threshold, Neuron::combined_type, Neuron::activation_type, Neuron::output_type,
-                  Neuron::input_type);
+/// The statics: the six of TNeuronProp in its order, the combined type and flat-spot
+/// elimination.
+inline auto NeuronStatics() {
+  return std::tie(Neuron::input_type, Neuron::activation_type, Neuron::activation_slope, Neuron::activation_threshold,
+                  Neuron::output_type, Neuron::output_threshold, Neuron::combined_type, Neuron::flat_spot_elimination);
 }
 
 class NeuronParamGuard {
 public:
-  ~NeuronParamGuard() { NeuronStaticsRefs() = saved_; }
+  ~NeuronParamGuard() { NeuronStatics() = saved_; }
 
 private:
-  std::tuple<int, float, float, float, int, ACT_TYPE, OUTPUT_TYPE, INPUT_TYPE> saved_ = NeuronStaticsRefs();
+  std::tuple<INPUT_TYPE, ACT_TYPE, float, float, OUTPUT_TYPE, float, int, int> saved_ = NeuronStatics();
 };
 
 #endif

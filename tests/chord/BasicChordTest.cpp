@@ -4,7 +4,6 @@
 // XGChordIx's order). Chords built from a basic chord are checked in
 // RootSpellingTest.cpp.
 #include "support/ChordBuilders.h"
-#include "support/TestPrelude.h"
 #include "training/ChordPatterns.h"
 
 namespace {

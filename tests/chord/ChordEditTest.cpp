@@ -3,7 +3,6 @@
 // counted out by hand from the octave rules.
 #include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

@@ -6,7 +6,6 @@
 #include "naming/HarmFuncNames.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

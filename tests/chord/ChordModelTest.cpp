@@ -2,7 +2,6 @@
 // cache and its lonely-lowest-note mark, the key number queries, comparisons, the
 // undefined chord, and the chord type catalogue.
 #include "support/ChordBuilders.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

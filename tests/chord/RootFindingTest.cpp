@@ -6,7 +6,6 @@
 #include "chord/RootWeights.h"
 #include "support/ChordBuilders.h"
 #include "support/SpellingOracle.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

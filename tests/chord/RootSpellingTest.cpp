@@ -4,7 +4,6 @@
 // scales.
 #include "scale/ScaleOracle.h"
 #include "support/ChordBuilders.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

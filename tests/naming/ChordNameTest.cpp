@@ -4,7 +4,6 @@
 #include "scale/ScaleOracle.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

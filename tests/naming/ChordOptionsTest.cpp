@@ -5,7 +5,6 @@
 #include "naming/ChordOptions.h"
 #include "support/ChordBuilders.h"
 #include "support/PrefGuard.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

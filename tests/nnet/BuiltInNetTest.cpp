@@ -3,7 +3,6 @@
 // entries bit for bit, its telling chords won clearly, the empty input weakly.
 #include "chord/NetForSingleChordAnalysis.h"
 #include "nnet/NetTestSupport.h"
-#include "support/TestPrelude.h"
 #include "training/ChordNetTargets.h"
 
 namespace {

@@ -3,7 +3,6 @@
 #define TONVEX_TESTS_NETTESTSUPPORT_H
 
 #include "support/NeuronParamGuard.h"
-#include "support/TestPrelude.h"
 
 namespace nettest {
 

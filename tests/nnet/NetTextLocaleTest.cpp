@@ -4,7 +4,6 @@
 // identical in the C locale and in German.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
-#include "support/TestPrelude.h"
 #include "training/ChordNetSource.h"
 #include "training/ChordPatterns.h"
 

@@ -2,7 +2,6 @@
 // the property-and-weight list as written, and what the readers make of odd lines.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

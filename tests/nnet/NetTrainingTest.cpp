@@ -2,7 +2,6 @@
 // stop rules and messages, the error measure, verification and the duplicate check.
 #include "nnet/NetReference.h"
 #include "nnet/NetTestSupport.h"
-#include "support/TestPrelude.h"
 
 #include <stdexcept>
 

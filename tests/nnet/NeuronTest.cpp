@@ -2,7 +2,6 @@
 // statics, the random start weights and the copy behaviour. Expected values come from
 // the formulas evaluated here in double precision.
 #include "nnet/NetTestSupport.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

@@ -3,7 +3,6 @@
 // evaluation in PackedForwardTest.cpp and against the reference model in
 // NetTrainingTest.cpp.
 #include "nnet/NetTestSupport.h"
-#include "support/TestPrelude.h"
 
 #include <cstddef>
 

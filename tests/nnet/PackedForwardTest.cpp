@@ -6,7 +6,6 @@
 // the process-wide parameters as they stand.
 #include "nnet/NetTestSupport.h"
 #include "support/TempFile.h"
-#include "support/TestPrelude.h"
 
 #include <limits>
 

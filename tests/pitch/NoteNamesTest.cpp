@@ -2,7 +2,6 @@
 // the letter model, and reading note names back.
 #include "support/PrefGuard.h"
 #include "support/SpellingOracle.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

@@ -1,6 +1,5 @@
 // Notes: note numbers, octaves and distances; spelling against the letter model.
 #include "support/SpellingOracle.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

@@ -5,7 +5,6 @@
 #define TONVEX_TESTS_SCALEORACLE_H
 
 #include "support/SpellingOracle.h"
-#include "support/TestPrelude.h"
 
 namespace scaleoracle {
 

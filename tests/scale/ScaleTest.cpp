@@ -2,7 +2,6 @@
 // degrees, checked against models built on the scale's own list of key numbers, and
 // the spelling tables, sign counts and key names against the letter model.
 #include "ScaleOracle.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

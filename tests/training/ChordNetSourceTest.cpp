@@ -3,7 +3,6 @@
 // weights are fitted to the text formats.
 #include "training/ChordNetSource.h"
 #include "support/NeuronParamGuard.h"
-#include "support/TestPrelude.h"
 
 #include <fstream>
 #include <iterator>

@@ -3,7 +3,6 @@
 // readings, and the accuracy count.
 #include "training/ChordPatterns.h"
 #include "support/NeuronParamGuard.h"
-#include "support/TestPrelude.h"
 
 namespace {
 

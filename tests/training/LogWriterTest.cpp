@@ -1,6 +1,5 @@
 // The training log: header, time-stamped and plain lines, appending.
 #include "support/TempFile.h"
-#include "support/TestPrelude.h"
 
 #include "training/LogWriter.h"
 

@@ -1,6 +1,6 @@
 #include "BenchSupport.h"
 
-#include "Voicings.h"
+#include "support/Voicings.h"
 
 std::vector<CMySet<int>> const& Voicings() {
   static std::vector<CMySet<int>> const voicings = MakeVoicings();

@@ -37,7 +37,7 @@ inline double MinOf(std::vector<double> const& values) {
 /// Registers a benchmark with the statistic "min" besides the default ones.
 #define TONVEX_BENCHMARK(fn) BENCHMARK(fn)->ComputeStatistics("min", MinOf)
 
-/// The voicings as note number sets (Voicings.h).
+/// The voicings as note number sets (tests/support/Voicings.h).
 std::vector<CMySet<int>> const& Voicings();
 /// Each voicing as a chord whose root was found by the built-in net and whose notes
 /// are spelled after it: the state in which a host names a chord.

@@ -1,6 +1,6 @@
 // The forward pass of a net of the built-in net's shape and weights.
 #include "BenchSupport.h"
-#include "Voicings.h"
+#include "support/Voicings.h"
 #include <tonvex/ChordAnalysisNet.h>
 #include <tonvex/NeuronalNet.h>
 

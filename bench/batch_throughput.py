@@ -1,7 +1,7 @@
 #!/usr/bin/env python3
 """Throughput of the tonvex program's batch mode: lines named per second.
 
-Writes a file of chord lines (the voicings of bench/Voicings.cpp, same
+Writes a file of chord lines (the voicings of tests/support/Voicings.cpp, same
 generator and seed, continued to the requested count; even lines as note names, odd
 lines as note numbers separated by commas), then times `tonvex < file > /dev/null`
 several times, pinned to one core with taskset when it is available. The whole

@@ -2,16 +2,31 @@
 // gets back when the name is too long for the string's inline buffer. Allocations
 // are counted by the operator new of support/AllocationCounter.cpp.
 #include "support/AllocationCounter.h"
-#include "support/PitchClassVoicings.h"
 #include "support/TestPrelude.h"
 
 namespace {
+
+// Every pitch-class set holding C, close above C and spread over two octaves above
+// a C doubled an octave lower: 1 to 13 notes.
+std::vector<CMySet<int>> Voicings() {
+  std::vector<CMySet<int>> voicings;
+  for (unsigned mask = 1; mask < 4096; mask += 2) {
+    CMySet<int> close, spread{36};
+    for (int pc = 0, step = 0; pc < 12; ++pc)
+      if (mask >> pc & 1u) {
+        close.insert(48 + pc);
+        spread.insert(48 + pc + 12 * (step++ % 2));
+      }
+    voicings.insert(voicings.end(), {close, spread});
+  }
+  return voicings;
+}
 
 // The name's own allocation, where it does not fit the string's inline buffer.
 std::uint64_t NameAllocations(std::string const& name) { return name.size() > std::string().capacity() ? 1 : 0; }
 
 TEST(Allocation, HostPathAllocatesOnlyLongNames) {
-  std::vector<CMySet<int>> const voicings = PitchClassVoicings();
+  std::vector<CMySet<int>> const voicings = Voicings();
   CChord reused(24);
   int longNames = 0;
   for (CMySet<int> const& voicing : voicings) {

@@ -1,7 +1,7 @@
 // Root finding and naming keep no state outside the chord they work on: threads
 // that analyse chords at the same time get the answers one thread gets alone. The
 // ThreadSanitizer build (.ci/run) runs this test to find any data race on the way.
-#include "support/PitchClassVoicings.h"
+#include "support/Voicings.h"
 #include <tonvex/Chord.h>
 
 #include <gtest/gtest.h>
@@ -28,7 +28,7 @@ std::string Analyse(CChord& chord, CMySet<int> const& voicing) {
 }
 
 TEST(ConcurrentAnalysis, EightThreadsGetTheAnswersOfOne) {
-  std::vector<CMySet<int>> const voicings = PitchClassVoicings();
+  std::vector<CMySet<int>> const voicings = MakeVoicings();
   std::size_t const count = voicings.size();
   std::vector<std::string> expected;
   CChord chord(24);

@@ -1,4 +1,4 @@
-#include "Voicings.h"
+#include "support/Voicings.h"
 
 namespace {
 

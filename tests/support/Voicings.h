@@ -1,6 +1,7 @@
-// The fixed set of chord voicings that every benchmark works on.
-#ifndef TONVEX_BENCH_VOICINGS_H
-#define TONVEX_BENCH_VOICINGS_H
+// The fixed set of chord voicings that every benchmark works on, and the tests that
+// run the benchmarks' workload.
+#ifndef TONVEX_TESTS_VOICINGS_H
+#define TONVEX_TESTS_VOICINGS_H
 
 #include <tonvex/MySet.h>
 

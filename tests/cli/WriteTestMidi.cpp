@@ -30,7 +30,10 @@ Bytes Song() {
   conductor.Tempo(0, 500000).TimeSig(0, 4, 2).End();
   MidiTrackBytes drums;
   drums.Name("Drums");
-  for (int beat = 0; beat < 20; ++beat) drums.On(0, beat % 2 == 0 ? 36 : 38, 110, 9).Off(Beat, beat % 2 == 0 ? 36 : 38, 9);
+  for (int beat = 0; beat < 20; ++beat) {
+    int const key = beat % 2 == 0 ? 36 : 38;
+    drums.On(0, key, 110, 9).Off(Beat, key, 9);
+  }
   return MidiFileBytes({conductor,
                         Chords("Piano", {{60, 64, 67}, {57, 60, 64}, {57, 60, 65}, {55, 59, 62, 65}}, 4 * Beat, 0),
                         Chords("Bass", {{40}, {33}, {41}, {31}}, 4 * Beat, 2), drums.End()});
@@ -60,7 +63,7 @@ int main(int argc, char** argv) {
   broken.resize(broken.size() - 4);
   mkdir(dir.c_str(), 0777);
   mkdir((dir + "/out").c_str(), 0777);
-  bool const ok = Write(dir + "/song.mid", Song()) && Write(dir + "/waltz.mid", Waltz()) &&
-                  Write(dir + "/broken.mid", broken);
+  bool const ok =
+      Write(dir + "/song.mid", Song()) && Write(dir + "/waltz.mid", Waltz()) && Write(dir + "/broken.mid", broken);
   return ok ? 0 : 1;
 }

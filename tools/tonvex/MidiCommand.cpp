@@ -26,7 +26,7 @@ std::string ReadFile(std::string const& path, std::vector<unsigned char>& bytes)
     std::size_t const count = std::fread(block, 1, sizeof block, in);
     bytes.insert(bytes.end(), block, block + count);
     if (bytes.size() > MaxFileSize) {
-      problem = "larger than 64 MiB, not a MIDI file";
+      problem = "larger than 64 MiB, too large for a MIDI file";
       break;
     }
     if (count < sizeof block) {
@@ -64,7 +64,8 @@ std::string OutputPath(std::string const& input, CMidiSettings const& settings) 
   std::string name = input.substr(input.find_last_of('/') + 1);
   std::size_t const dot = name.find_last_of('.');
   if (dot != std::string::npos && dot > 0) name.erase(dot);
-  return settings.OutDir + '/' + name + Extension(settings.Format);
+  std::string const& dir = settings.OutDir;
+  return dir + (dir.back() == '/' ? "" : "/") + name + Extension(settings.Format);
 }
 
 // The timeline runs to the last note-off of the file, of any track or channel: where

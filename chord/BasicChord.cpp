@@ -116,6 +116,9 @@ CChord::TBasicChord CChord::BasicChord() const {
 }
 
 void CChord::SetBasicChord(TBasicChord bc) {
+  // The moves below edit the cache in place, which a stale cache would lose: a
+  // root just set leaves it stale, and its rebuild folds a moved 12 into 0.
+  RefreshIntvls();
   if (bc == bc_none) {
     for (int intvl : {3, 4, 7}) Intvls_.EraseIntvl(intvl);
     return;

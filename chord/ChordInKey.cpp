@@ -4,6 +4,7 @@
 
 #include "SignKey.h"
 #include "chord/ClosenessTables.h"
+#include "chord/HarmFuncCodes.h"
 #include "pitch/KeySignCount.h"
 #include "pitch/NoteNrs.h"
 
@@ -26,17 +27,6 @@ bool InKey(std::uint32_t keyPitchClasses, CNote const& note) {
   int k = note.KeyNr();
   return k >= 0 && (keyPitchClasses >> k & 1u) != 0;
 }
-
-// Harmonic function code by degree of the root (0..6) and basic chord (0..7).
-constexpr int HarmFuncCodes[7][8] = {
-    // none maj min aug dim sus4 sus2 drone
-    {0, 1, 2, 0, 0, 0, 0, 0},     // I
-    {0, 3, 4, 0, 5, 0, 0, 0},     // II
-    {0, 6, 7, 0, 0, 0, 0, 0},     // III
-    {0, 8, 9, 0, 0, 0, 0, 0},     // IV
-    {0, 10, 11, 0, 0, 10, 10, 0}, // V
-    {0, 12, 13, 0, 0, 0, 0, 0},   // VI
-    {0, 0, 0, 0, 15, 0, 0, 0}};   // VII
 
 } // namespace
 

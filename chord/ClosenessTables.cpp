@@ -1,8 +1,9 @@
 // Closeness of a chord to a key: one table per basic chord and key mode, indexed by
-// the distance of the chord's root above the key's root. The values are taken as
-// they have always been, odd ones included: a major chord a major third above a
-// major key's root scores 2, diminished and augmented chords score 2 everywhere in a
-// major key, and sus2 and drone chords score alike in a minor key.
+// the distance of the chord's root above the key's root. The values are fixed
+// answers that hosts rank chords by, so they stand as given, odd ones included: a
+// major chord a major third above a major key's root scores 2, diminished and
+// augmented chords score 2 everywhere in a major key, and sus2 and drone chords score
+// alike in a minor key.
 #include "chord/ClosenessTables.h"
 
 namespace {

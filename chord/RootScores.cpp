@@ -1,18 +1,12 @@
 // Chords: the rule-based score of a pitch class as a chord's root.
 #include "Chord.h"
 
+#include "chord/RootWeights.h"
 #include "pitch/NoteNrs.h"
 
 #include <cstddef>
 
 int CChord::ProbThatNoteIsRootNote(CNote const& candidate) const {
-  // Weights by the distance in semitones from the candidate up to a chord note, one
-  // table per number of intervals: 1 or 2, 3, 4 to 6, 7 and more.
-  static constexpr int weight2[12] = {3, 0, 0, 2, 2, 0, 0, 1, 0, 0, 2, 2};
-  static constexpr int weight3[12] = {18, 0, 2, 12, 12, 2, 2, 14, 1, 2, 5, 5};
-  static constexpr int weight4[12] = {18, 0, 3, 12, 12, 3, 3, 14, 0, 3, 3, 3};
-  static constexpr int weight7[12] = {18, 8, 8, 12, 12, 6, 5, 14, 4, 4, 10, 10};
-
   RefreshIntvls();
   int const c = PitchClass(candidate.NoteNr());
   int const lowest = PitchClass(LowestNote().NoteNr());
@@ -38,7 +32,7 @@ int CChord::ProbThatNoteIsRootNote(CNote const& candidate) const {
     if (first < 0) first = PitchClass(note.NoteNr());
   }
 
-  int const* weights = count <= 2 ? weight2 : (count == 3 ? weight3 : (count <= 6 ? weight4 : weight7));
+  int const* weights = RootWeights(count);
   int sum = 0;
   std::size_t index = 0;
   for (int intvl : Intvls_) {

@@ -12,8 +12,9 @@ struct CHarmFuncTexts {
   char const* FunctionalMinor;
 };
 
-// By code 0..15. The texts are kept as they have always been printed, the
-// unfinished-looking ones included; code 7 in a major key shares "Sp" with code 4.
+// By code 0..15. The texts are the library's fixed output, which hosts show and
+// compare against, so they stand as given, the unfinished-looking ones included;
+// code 7 in a major key shares "Sp" with code 4.
 constexpr CHarmFuncTexts HarmFuncTexts[] = {{"undef", "undef", "undef"},
                                             {"I", "T", "T"},
                                             {"Im", "t", "t"},

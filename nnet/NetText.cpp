@@ -3,16 +3,18 @@
 #include "NeuronalNet.h"
 #include "nnet/FlatWeights.h"
 #include "nnet/LocalTime.h"
+#include "nnet/NumberText.h"
 
 #include <algorithm>
 #include <cctype>
 #include <cfloat>
+#include <charconv>
 #include <climits>
 #include <cstdio>
-#include <cstdlib>
 #include <cstring>
 #include <fstream>
 #include <limits>
+#include <locale>
 #include <sstream>
 
 namespace {
@@ -71,15 +73,17 @@ bool EndsWithKey(std::string const& line, char const* key) {
   return line.compare(line.size() - length, length, key) == 0;
 }
 
-// The line's prefix of digits, '-' and '.', at most 49 characters, as atof reads
-// it; values beyond float saturate to infinity as a float conversion would.
+// The line's prefix of digits, '-' and '.', at most 49 characters, read as atof
+// reads it in the C locale (whatever locale the host set: the files are written with
+// a point) and 0 where it holds no number; values beyond float saturate to infinity
+// as a float conversion would.
 float NumberPrefix(std::string const& line) {
-  std::string prefix;
-  for (char c : line) {
-    if (!(std::isdigit(static_cast<unsigned char>(c)) || c == '-' || c == '.') || prefix.size() == 49) break;
-    prefix += c;
-  }
-  const double value = std::strtod(prefix.c_str(), nullptr);
+  std::size_t length = 0;
+  while (length < line.size() && length < 49 &&
+         (std::isdigit(static_cast<unsigned char>(line[length])) || line[length] == '-' || line[length] == '.'))
+    ++length;
+  double value = 0.0;
+  std::from_chars(line.data(), line.data() + length, value);
   if (value > static_cast<double>(FLT_MAX)) return std::numeric_limits<float>::infinity();
   if (value < -static_cast<double>(FLT_MAX)) return -std::numeric_limits<float>::infinity();
   return static_cast<float>(value);
@@ -174,6 +178,7 @@ void ApplyProperty(TNetProp& result, Field field, std::string const& line) {
 
 std::string NeuronalNet::weights_to_text(int mode, float error, float cycles, std::vector<training_pattern> patterns) {
   std::ostringstream out;
+  out.imbue(std::locale::classic()); // read back by NumberPrefix in any locale
   TNeuronProp const& p = dyn_.neuron_prop;
   const int H = LayerCount();
   out << LocalTimeText() << endl << endl;
@@ -291,7 +296,8 @@ void NeuronalNet::load_weights_from_file(char const* path) {
     std::getline(in, line);
     CutLine(line);
     values.push_back(NumberPrefix(line));
-    std::printf("weight %i, %f\n", static_cast<int>(values.size()), static_cast<double>(values.back()));
+    std::printf("weight %i, %s\n", static_cast<int>(values.size()),
+                FixedText(static_cast<double>(values.back())).c_str());
   }
   CopyWeightsFrom(neurons_, values.data(), values.size());
   WeightsChanged();

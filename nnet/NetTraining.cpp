@@ -1,6 +1,7 @@
 // Back-propagation with momentum, the error measure and the pattern set checks.
 #include "NeuronalNet.h"
 #include "nnet/FlatWeights.h"
+#include "nnet/NumberText.h"
 
 #include <climits>
 #include <cmath>
@@ -23,15 +24,15 @@ int TruncatedLevel(float mean) {
 void PrintPatternBlock(int index, training_pattern const& p) {
   std::printf("%i %s: \n", index, p.name.c_str());
   std::printf("Input: ");
-  for (float value : p.inputs) std::printf("%f ", static_cast<double>(value));
+  for (float value : p.inputs) std::printf("%s ", FixedText(static_cast<double>(value)).c_str());
   std::printf("\nOutput: ");
-  for (float value : p.outputs) std::printf("%f ", static_cast<double>(value));
+  for (float value : p.outputs) std::printf("%s ", FixedText(static_cast<double>(value)).c_str());
   std::printf("\n");
 }
 
 void PrintStop(int cycle, float mean) {
   std::printf("Abbruch bei Cycle %d\n", cycle);
-  std::printf("Fehler: %f\n", static_cast<double>(mean));
+  std::printf("Fehler: %s\n", FixedText(static_cast<double>(mean)).c_str());
 }
 
 } // namespace

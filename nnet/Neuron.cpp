@@ -19,8 +19,9 @@ INPUT_TYPE Neuron::input_type = INPUT_SUM;
 
 namespace {
 
-// The flat-spot constant is a float literal in the trained nets' history; it is added
-// in double, so its widened value is what counts.
+// The flat-spot constant is the float 0.1 added in double, so its widened value
+// 0.10000000149011612 is what counts: the built-in net's weights were trained with
+// that derivative, and retraining must reproduce them.
 constexpr double FlatSpot = static_cast<double>(0.1f);
 
 std::size_t Count(int n) { return static_cast<std::size_t>(std::max(n, 0)); }
@@ -43,7 +44,9 @@ float NetInput(float const* x, float const* w, int n, int weightCount) {
     return z;
   }
   case INPUT_PROD: {
-    if (terms <= 0) return 0.0f;
+    // Starts from x[0] * w[0] even when n is 0, as the minimum and maximum start
+    // from x[0]; a neuron without weights has no w[0].
+    if (weightCount <= 0) return 0.0f;
     float z = x[0] * w[0];
     for (int i = 1; i < terms; ++i) z *= x[i] * w[i];
     return z;

@@ -34,11 +34,10 @@ memcheck="valgrind --quiet --error-exitcode=99 --leak-check=full --show-leak-kin
 memcheck+=" --errors-for-leak-kinds=definite,indirect,possible"
 
 # The sweeps over all pitch-class sets and voicings, by test name.
-sweeps="RootFindingByRules.EveryKeyNumberSetUnderEveryCurrentRoot:RootFindingByRules.EveryVoicingAboveABassInAnotherOctave"
-sweeps+=":IntvlSet.ListQueriesOnAllPitchClassSets:IntvlSet.ComparisonWalksOnlyTheLeftOperand"
-sweeps+=":BasicChord.IntervalsInsertedAboveTheOctaveCountInAnyOctave:BasicChord.EveryPitchClassSetOverEveryRootIsRecognised"
-sweeps+=":ChordInKeyCounts.EveryPitchClassSetInEveryKey:MoveInScale.StepsThroughTheScaleNotes"
-sweeps+=":RootFindingByNet.EveryPitchClassSetOverEveryBass:RootByNetTables.*:ConcurrentAnalysis.*"
+sweeps="RootFindingByRules.EveryPitchClassSetUnderEveryRootAndOverEveryBass:IntvlSet.QueriesOnAllPitchClassSetPairs"
+sweeps+=":BasicChord.EveryPitchClassSetOverEveryRoot:BasicChord.IntervalsAboveTheOctave"
+sweeps+=":ChordInKey.NotesAndIntervalsOutsideTheKey:MoveInScale.StepsThroughTheScaleNotes"
+sweeps+=":RootSpelling.EveryPitchClassSetAfterRootFinding:RootByNetTables.*:ConcurrentAnalysis.*"
 sweeps+=":ChordSymbolRoundTrip.EveryPitchClassSetWithEveryBass:ChordSymbolRoundTrip.CatalogueAndXGTypesOnEveryRootInEveryInversion"
 filter=()
 [ $quick = 1 ] && filter=("--gtest_filter=-$sweeps")

@@ -1,8 +1,8 @@
 // The generated source of the built-in net's data and its reading back.
 #include "training/ChordNetSource.h"
 
+#include <charconv>
 #include <cmath>
-#include <cstdlib>
 
 namespace {
 
@@ -59,14 +59,15 @@ std::vector<float> WeightsOfChordNetSource(std::string const& source) {
   char const* cursor = source.c_str() + at + 1;
   char const* const stop = source.c_str() + end;
   while (cursor < stop) {
-    char* next = nullptr;
-    const double value = std::strtod(cursor, &next);
-    if (next == cursor) {
+    // The written decimals, as the C locale writes them, in any locale.
+    double value = 0.0;
+    const std::from_chars_result read = std::from_chars(cursor, stop, value);
+    if (read.ec != std::errc()) {
       ++cursor;
       continue;
     }
     weights.push_back(static_cast<float>(value));
-    cursor = next;
+    cursor = read.ptr;
   }
   return weights;
 }

@@ -38,6 +38,7 @@
 // --quick runs a few short epochs that branch early and writes the best state
 // whatever it reached: a check of the pipeline, not a net to ship.
 #include "training/ChordNetSource.h"
+#include "training/ChordNetTargets.h"
 #include "training/ChordPatterns.h"
 #include "training/LogWriter.h"
 
@@ -59,29 +60,6 @@ constexpr float StartRate = 0.2f;
 constexpr float StartMomentum = 0.6f;
 constexpr int HiddenSize = 15;
 constexpr std::size_t WeightCount = 765;
-
-// Entries of weight_definitions given as data; training keeps them exactly.
-struct Pin {
-  std::size_t index;
-  float value;
-};
-constexpr Pin Pins[] = {
-    {0, -12.8459f},   {1, 84.8939f},   {2, 22.1978f},    {3, -43.6413f},  {4, -25.9571f},   {5, 75.0373f},
-    {6, 47.4166f},    {7, -31.6487f},  {8, -0.473688f},  {9, 62.579f},    {360, 4.05962f},  {361, 17.7252f},
-    {362, 0.737212f}, {363, 26.1606f}, {585, 2.76766f},  {586, 1.16248f}, {587, -11.2484f}, {588, -5.81468f},
-    {757, -8.27008f}, {758, 13.1361f}, {759, -9.52837f}, {760, 11.3069f}, {761, -29.4672f}, {762, -16.8347f},
-    {763, -13.2241f}, {764, 1.7355f},
-};
-
-// Chords whose winner must stand out: pitch classes above the bass, winner.
-struct TellingChord {
-  std::vector<int> intvls;
-  int winner;
-};
-const TellingChord TellingChords[] = {{{0}, 0},           {{0, 4, 7}, 0}, {{0, 3, 7}, 0},
-                                      {{0, 4, 7, 10}, 0}, {{0, 3, 8}, 8}, {{0, 5, 9}, 5}};
-constexpr float TellingOutput = 0.99f;
-constexpr float EmptyOutputBelow = 0.98f;
 
 struct Schedule {
   int epochCycles;
@@ -160,7 +138,7 @@ std::vector<float> WeightsOf(NeuronalNet& net) {
 void ImposePins(NeuronalNet& net) {
   TPredefinedWeights record = net.get_weights();
   const std::unique_ptr<float[]> owned(record.weights);
-  for (Pin const& pin : Pins) record.weights[pin.index] = pin.value;
+  for (TChordNetPin const& pin : ChordNetPins) record.weights[pin.index] = pin.value;
   net.acquire_weights(record);
 }
 
@@ -207,7 +185,7 @@ Verdict Judge(NeuronalNet& net, std::vector<training_pattern> const& patterns,
       if (j != label) v.minMargin = std::min(v.minMargin, out[label] - out[j]);
   }
   v.minTellingOutput = 1.0f;
-  for (TellingChord const& chord : TellingChords) {
+  for (TTellingChord const& chord : TellingChords) {
     net.use(ChordNetInputs(chord.intvls));
     v.minTellingOutput = net.winner() == chord.winner
                              ? std::min(v.minTellingOutput, net.get_outputs()[static_cast<std::size_t>(chord.winner)])
@@ -359,7 +337,7 @@ int main(int argc, char** argv) {
     const std::unique_ptr<NeuronalNet> rounded = MakeNet(shipped);
     verdict = Judge(*rounded, patterns, classes, schedule);
   }
-  for (Pin const& pin : Pins)
+  for (TChordNetPin const& pin : ChordNetPins)
     if (shipped[pin.index] != pin.value) {
       Say(log, "pinned entry " + std::to_string(pin.index) + " does not survive the text");
       return 1;

@@ -330,8 +330,9 @@ public:
   ///     second is, else drone for exactly {0, 7} or {0, 7, 12}; everything else
   ///     (no fifth at all, or C G Bb) is none.
   TBasicChord BasicChord() const;
-  /// Reshapes the chord into the given basic chord: notes at the wrong third or
-  /// fifth are moved (ChangeAllNotesWithinIntvlRange), then the missing intervals of
+  /// Reshapes the chord into the given basic chord. The interval cache is brought up
+  /// to date first, as for every query; then notes at the wrong third or fifth are
+  /// moved (ChangeAllNotesWithinIntvlRange), then the missing intervals of
   /// the basic chord are added in the comping range (AddIntvlInCompingRange):
   ///   bc_maj   3 -> 4, 6..8 -> 7, then ensure 0, 4, 7
   ///   bc_min   4 -> 3, 6..8 -> 7, then ensure 0, 3, 7
@@ -341,9 +342,8 @@ public:
   ///   bc_sus2  3..5 -> 2, 6..8 -> 7, then ensure 0, 2, 7
   ///   bc_drone 4..9 -> 7, 1..3 -> 0, 10..11 -> 12, then ensure 0, 7
   /// so 60 64 67 over root 60 with bc_min becomes 60 63 67 with the cache {0, 3, 7}.
-  /// bc_none removes 3, 4 and 7 from the interval cache as it stands and leaves the
-  /// notes alone (on a stale cache the next rebuild brings them back). Other values
-  /// do nothing.
+  /// bc_none removes 3, 4 and 7 from the interval cache and leaves the notes alone
+  /// (the next rebuild brings them back). Other values change nothing.
   void SetBasicChord(TBasicChord bc);
   /// The intervals of the basic chord (wrap 24): major {0, 4, 7}, minor {0, 3, 7},
   /// augmented {0, 4, 8}, diminished {0, 3, 6}, sus4 {0, 5, 7}, sus2 {0, 2, 7},
@@ -472,10 +472,11 @@ public:
   /// Code 14 (bVII) has a name but no chord gets it.
   int HarmFuncIn(CSignKey const& key) const;
   /// How close the chord lies to the key, 0..2, from a table per basic chord and key
-  /// mode indexed by the root's distance above the key's root. The tables are kept
-  /// as they have always been, surprising values included (in a major key a major
-  /// chord on the major third scores 2, diminished and augmented chords score 2
-  /// everywhere). For basic chord none the result is CountIntvlsInSignKey instead.
+  /// mode indexed by the root's distance above the key's root. The tables are fixed
+  /// answers that hosts rank chords by, surprising values included (in a major key
+  /// a major chord on the major third scores 2, diminished and augmented chords
+  /// score 2 everywhere). For basic chord none the result is CountIntvlsInSignKey
+  /// instead.
   int ClosenessToSignKey(CSignKey const& key) const;
   /// How many of the cached intervals lie in the key, each interval counted once by
   /// the note it stands for (IntvlIxToNote). An interval cached above the octave
@@ -561,7 +562,7 @@ public:
   /// Harmonic function name of HarmFuncIn(key): Roman ("IIm", "V", "VIIdim") or,
   /// with HarmFuncNaming 1, functional letters ("Sp", "D"), some by the key's mode
   /// ("III" is "TG" in a major key, "P" in a minor one). Code 0 is "undef". The
-  /// texts are kept as they have always been printed, unfinished-looking ones
+  /// texts are fixed output that hosts compare against, unfinished-looking ones
   /// included ("IIdim##", "VIIdim##in ks_min").
   std::string HarmFuncName(CSignKey key, CChordnamePref& pref) const;
 

@@ -62,8 +62,9 @@ public:
   /// and INPUT_AVG gives 0/0 (NaN). INPUT_MIN and INPUT_MAX start from inputs[0] and
   /// read it even when n <= 0, so `inputs` must hold at least one value for them.
   /// Weights beyond this neuron's input count do not exist and count as 0 (n larger
-  /// than the input count reads no weight past the array); a neuron without weights
-  /// therefore has the net input 0 under INPUT_PROD. An input type outside 0..4
+  /// than the input count reads no weight past the array). INPUT_PROD starts from
+  /// inputs[0] * weights[0], even when n <= 0; a neuron without weights has the net
+  /// input 0 under it. An input type outside 0..4
   /// gives the net input 0, an activation type outside 0..3 leaves a = z, and an
   /// output type other than OUTPUT_BIN behaves as OUTPUT_NONE.
   void calcValue(float const* inputs, int n, float* outputs, int index);

@@ -2,40 +2,22 @@
 // gets back when the name is too long for the string's inline buffer. Allocations
 // are counted by the operator new of support/AllocationCounter.cpp.
 #include "support/AllocationCounter.h"
-#include <tonvex/Chord.h>
-#include <tonvex/ChordAnalysisNet.h>
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <cstdint>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace {
 
-// Chords of 1 to 8 notes: every pitch class set of up to 8 classes over the bass
-// pitch classes 0, 5 and 10 where it holds them, close above the bass, and (up to
-// 7 classes) spread over two octaves above the bass doubled an octave lower.
+// Every pitch-class set holding C, close above C and spread over two octaves above
+// a C doubled an octave lower: 1 to 13 notes.
 std::vector<CMySet<int>> Voicings() {
   std::vector<CMySet<int>> voicings;
-  for (unsigned mask = 1; mask < 4096; ++mask) {
-    int classes = 0;
-    for (unsigned m = mask; m != 0; m &= m - 1) ++classes;
-    if (classes > 8) continue;
-    for (int bass = 0; bass < 12; bass += 5) {
-      if (!(mask >> bass & 1u)) continue;
-      CMySet<int> close, spread{36 + bass};
-      int step = 0;
-      for (int pc = 0; pc < 12; ++pc) {
-        if (!(mask >> pc & 1u)) continue;
-        int const above = (pc - bass + 12) % 12;
-        close.insert(48 + bass + above);
-        if (classes < 8) spread.insert(48 + bass + above + 12 * (step++ % 2));
+  for (unsigned mask = 1; mask < 4096; mask += 2) {
+    CMySet<int> close, spread{36};
+    for (int pc = 0, step = 0; pc < 12; ++pc)
+      if (mask >> pc & 1u) {
+        close.insert(48 + pc);
+        spread.insert(48 + pc + 12 * (step++ % 2));
       }
-      voicings.push_back(close);
-      if (classes < 8) voicings.push_back(spread);
-    }
+    voicings.insert(voicings.end(), {close, spread});
   }
   return voicings;
 }

@@ -1,229 +1,92 @@
-// A chord in a key: harmonic function codes, closeness to the key, the notes and
-// intervals outside it. Expectations come from the degree tables of major and minor
-// keys, the function codes and the closeness tables, all written out here as data.
+// A chord in a key: harmonic function codes and names, closeness, the notes and intervals
+// outside the key, for chords on every pitch class in every major and minor key,
+// read through the key's own list of degrees and the tables of chord/.
+#include "chord/ClosenessTables.h"
+#include "chord/HarmFuncCodes.h"
+#include "naming/HarmFuncNames.h"
 #include "support/ChordBuilders.h"
-#include <tonvex/Chord.h>
-#include <tonvex/SignKey.h>
-
-#include <gtest/gtest.h>
-
-#include <string>
-#include <vector>
+#include "support/PrefGuard.h"
+#include "support/TestPrelude.h"
 
 namespace {
 
 using namespace chordtest;
 
-// Semitones above the key's root, by degree.
-constexpr int MajorDegrees[7] = {0, 2, 4, 5, 7, 9, 11};
-constexpr int MinorDegrees[7] = {0, 2, 3, 5, 7, 8, 10};
-
-CSignKey Key(int root, bool major) {
-  return CSignKey(Nat(root), major ? CSignKey::SignKey_Major : CSignKey::SignKey_Minor);
+std::vector<CSignKey> AllKeys() {
+  std::vector<CSignKey> keys;
+  for (int root = 0; root < 12; ++root)
+    for (auto type : {CSignKey::SignKey_Major, CSignKey::SignKey_Minor}) keys.emplace_back(Nat(root), type);
+  return keys;
 }
 
-std::string KeyLabel(int root, bool major) { return std::to_string(root) + (major ? " major" : " minor"); }
-
-// Whether pitch class pc (0..11) lies on a degree of the key.
-bool InKey(int pc, int root, bool major) {
-  for (int d : major ? MajorDegrees : MinorDegrees)
-    if ((root + d) % 12 == pc) return true;
-  return false;
-}
-
-// A chord of the basic chord built on pitch class pc; for bc_none the notes of
-// root, fifth and minor seventh, which classify as no basic chord.
+// A chord of the basic chord on pitch class pc; for bc_none root, fifth and minor
+// seventh, which are no basic chord.
 CChord ChordOn(int pc, int bc) {
-  if (bc == CChord::bc_none) {
-    CChord chord = ChordOf({48 + pc, 55 + pc, 58 + pc});
-    chord.SetRootNote(Nat(48 + pc));
-    return chord;
-  }
+  if (bc == CChord::bc_none) return NotesThenRoot(Nat(48 + pc), {48 + pc, 55 + pc, 58 + pc});
   return CChord(Nat(60 + pc), static_cast<CChord::TBasicChord>(bc), 24);
 }
 
-// ---- Harmonic function -------------------------------------------------------------
-
-struct FuncRow {
-  int degree;
-  int bc;
-  int code;
-};
-// Every (degree, basic chord) pair with a code; all others give 0.
-std::vector<FuncRow> const FuncCodes = {
-    {0, CChord::bc_maj, 1},  {0, CChord::bc_min, 2},  {1, CChord::bc_maj, 3},   {1, CChord::bc_min, 4},
-    {1, CChord::bc_dim, 5},  {2, CChord::bc_maj, 6},  {2, CChord::bc_min, 7},   {3, CChord::bc_maj, 8},
-    {3, CChord::bc_min, 9},  {4, CChord::bc_maj, 10}, {4, CChord::bc_sus4, 10}, {4, CChord::bc_sus2, 10},
-    {4, CChord::bc_min, 11}, {5, CChord::bc_maj, 12}, {5, CChord::bc_min, 13},  {6, CChord::bc_dim, 15}};
-
-int ExpectedCode(int degree, int bc) {
-  for (FuncRow const& row : FuncCodes)
-    if (row.degree == degree && row.bc == bc) return row.code;
-  return 0;
-}
-
-TEST(HarmFuncIn, EveryDegreeAndBasicChordInEveryKey) {
-  for (bool major : {true, false})
-    for (int root = 0; root < 12; ++root) {
-      CSignKey key = Key(root, major);
-      for (int dist = 0; dist < 12; ++dist) {
-        int degree = -1;
-        for (int d = 0; d < 7; ++d)
-          if ((major ? MajorDegrees : MinorDegrees)[d] == dist) degree = d;
-        for (int bc = 0; bc <= 7; ++bc) {
-          CChord chord = ChordOn((root + dist) % 12, bc);
-          ASSERT_EQ(chord.BasicChord(), bc);
-          int expected = degree < 0 ? 0 : ExpectedCode(degree, bc);
-          EXPECT_EQ(chord.HarmFuncIn(key), expected) << KeyLabel(root, major) << " distance " << dist << " bc " << bc;
+TEST(ChordInKey, FunctionAndClosenessOfEveryBasicChordOnEveryPitchClass) {
+  PrefGuard guard;
+  for (CSignKey const& key : AllKeys()) {
+    CScale const& scale = key.Scale();
+    int const keyRoot = key.RootNote().KeyNr();
+    bool const major = key.SignKeyType() == CSignKey::SignKey_Major;
+    for (int distance = 0; distance < 12; ++distance) {
+      int degree = -1; // of the chord's root in the key
+      for (int d = 0; d < 7; ++d)
+        if (scale.DegreeNrToKeyNr(d) == (keyRoot + distance) % 12) degree = d;
+      for (int bc = CChord::bc_none; bc <= CChord::bc_drone; ++bc) {
+        CChord const chord = ChordOn((keyRoot + distance) % 12, bc);
+        ASSERT_EQ(chord.BasicChord(), bc);
+        int const code = degree < 0 ? 0 : HarmFuncCodes[degree][bc];
+        EXPECT_EQ(chord.HarmFuncIn(key), code) << key.Name(DefaultChordnamePref) << " " << distance << " " << bc;
+        for (int naming : {0, 1, 2}) { // only 1 names functions
+          CChordnamePref::HarmFuncNaming = naming;
+          EXPECT_EQ(chord.HarmFuncName(key, DefaultChordnamePref), HarmFuncText(code, naming == 1, major)) << naming;
         }
+        int const* closeness = ClosenessTable(bc, major);
+        EXPECT_EQ(chord.ClosenessToSignKey(key), closeness ? closeness[distance] : chord.CountIntvlsInSignKey(key))
+            << key.Name(DefaultChordnamePref) << " " << distance << " " << bc;
       }
     }
+  }
+  // The root counts by its pitch class, whatever its octave or spelling; the
+  // undefined root has key number 3.
+  CSignKey const cMajor(Nat(0), CSignKey::SignKey_Major), cMinor(Nat(0), CSignKey::SignKey_Minor);
+  EXPECT_EQ(NotesThenRoot(CNote(31, Enh_DoubleSharp), {43, 47, 50}).HarmFuncIn(cMajor), 10);
+  EXPECT_EQ(NotesThenRoot(CNote_Undef, {51, 55, 58}).HarmFuncIn(cMinor), 6);
 }
 
-TEST(HarmFuncIn, NamedCases) {
-  CSignKey cMajor = Key(0, true);
-  EXPECT_EQ(ChordOn(0, CChord::bc_maj).HarmFuncIn(cMajor), 1);
-  EXPECT_EQ(ChordOn(2, CChord::bc_min).HarmFuncIn(cMajor), 4);
-  EXPECT_EQ(ChordOn(11, CChord::bc_dim).HarmFuncIn(cMajor), 15);
-  EXPECT_EQ(ChordOn(7, CChord::bc_sus4).HarmFuncIn(cMajor), 10);
-  EXPECT_EQ(ChordOn(7, CChord::bc_min).HarmFuncIn(cMajor), 11);
-  EXPECT_EQ(ChordOn(10, CChord::bc_maj).HarmFuncIn(cMajor), 0);
-  // The root counts by its pitch class, whatever its octave or spelling.
-  CChord chord = ChordOf({43, 47, 50});
-  chord.SetRootNote(CNote(31, Enh_DoubleSharp)); // G spelled F double sharp
-  EXPECT_EQ(chord.HarmFuncIn(cMajor), 10);
-  // The undefined root has key number 3: the third degree of C minor.
-  CChord undefinedRoot = ChordOf({51, 55, 58});
-  undefinedRoot.SetRootNote(CNote_Undef);
-  EXPECT_EQ(undefinedRoot.HarmFuncIn(Key(0, false)), 6);
-}
-
-// ---- Closeness ---------------------------------------------------------------------
-
-// The closeness tables by key mode and basic chord 1..7, indexed by the root's
-// distance above the key's root.
-struct ClosenessTable {
-  bool major;
-  int bc;
-  int values[12];
-};
-std::vector<ClosenessTable> const ClosenessTables = {
-    {true, CChord::bc_maj, {2, 0, 0, 0, 2, 2, 0, 2, 0, 0, 0, 0}},
-    {true, CChord::bc_min, {0, 0, 2, 0, 2, 0, 0, 0, 0, 2, 0, 0}},
-    {true, CChord::bc_dim, {2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2}},
-    {true, CChord::bc_aug, {2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2, 2}},
-    {true, CChord::bc_sus4, {2, 0, 2, 0, 2, 0, 0, 2, 0, 2, 0, 0}},
-    {true, CChord::bc_sus2, {2, 0, 2, 0, 0, 2, 0, 2, 0, 2, 0, 0}},
-    {true, CChord::bc_drone, {2, 0, 2, 0, 2, 2, 0, 2, 0, 2, 0, 0}},
-    {false, CChord::bc_maj, {0, 0, 0, 2, 0, 1, 0, 2, 2, 0, 2, 0}},
-    {false, CChord::bc_min, {2, 0, 0, 0, 0, 2, 0, 2, 0, 2, 0, 0}},
-    {false, CChord::bc_dim, {0, 0, 2, 0, 0, 0, 0, 0, 0, 0, 0, 2}},
-    {false, CChord::bc_aug, {1, 1, 1, 1, 1, 1, 0, 2, 0, 0, 0, 0}},
-    {false, CChord::bc_sus4, {1, 0, 0, 1, 0, 1, 0, 2, 0, 0, 1, 0}},
-    {false, CChord::bc_sus2, {1, 0, 0, 1, 0, 1, 0, 1, 1, 0, 1, 0}},
-    {false, CChord::bc_drone, {1, 0, 0, 1, 0, 1, 0, 1, 1, 0, 1, 0}},
-};
-
-TEST(ClosenessToSignKey, EveryTableEntryInEveryKey) {
-  ASSERT_EQ(ClosenessTables.size(), 14u);
-  for (ClosenessTable const& table : ClosenessTables)
-    for (int root = 0; root < 12; ++root) {
-      CSignKey key = Key(root, table.major);
-      for (int dist = 0; dist < 12; ++dist) {
-        CChord chord = ChordOn((root + dist) % 12, table.bc);
-        ASSERT_EQ(chord.BasicChord(), table.bc);
-        EXPECT_EQ(chord.ClosenessToSignKey(key), table.values[dist])
-            << KeyLabel(root, table.major) << " distance " << dist << " bc " << table.bc;
-      }
-    }
-}
-
-TEST(ClosenessToSignKey, NoBasicChordGivesItsCountOfIntervalsInTheKey) {
-  for (bool major : {true, false})
-    for (int root = 0; root < 12; ++root)
+// Every pitch class set in every key: pitch classes divisible by 3 doubled two
+// octaves up count twice among the notes, once among the intervals.
+TEST(ChordInKey, NotesAndIntervalsOutsideTheKey) {
+  for (CSignKey const& key : AllKeys()) {
+    for (unsigned set = 0; set < 4096; ++set) {
+      CMySet<int> noteNrs;
+      int in = 0, out = 0, notesOut = 0;
       for (int pc = 0; pc < 12; ++pc) {
-        // Root, fifth and minor seventh: no basic chord.
-        int expected = 0;
-        for (int intvl : {0, 7, 10}) expected += InKey((pc + intvl) % 12, root, major) ? 1 : 0;
-        EXPECT_EQ(ChordOn(pc, CChord::bc_none).ClosenessToSignKey(Key(root, major)), expected)
-            << KeyLabel(root, major) << " root " << pc;
+        if ((set >> pc & 1u) == 0) continue;
+        bool const inKey = key.Scale().HasKeyNr(pc);
+        (inKey ? in : out) += 1;
+        noteNrs.insert(48 + pc);
+        notesOut += inKey ? 0 : pc % 3 == 0 ? 2 : 1;
+        if (pc % 3 == 0) noteNrs.insert(72 + pc);
       }
-  EXPECT_EQ(CChord(24).ClosenessToSignKey(Key(0, true)), 0);
-}
-
-TEST(ClosenessToSignKey, NamedCases) {
-  CSignKey cMajor = Key(0, true), aMinor = Key(9, false);
-  EXPECT_EQ(ChordOn(4, CChord::bc_maj).ClosenessToSignKey(cMajor), 2);
-  EXPECT_EQ(ChordOn(9, CChord::bc_min).ClosenessToSignKey(cMajor), 2);
-  EXPECT_EQ(ChordOn(1, CChord::bc_dim).ClosenessToSignKey(Key(7, true)), 2);
-  EXPECT_EQ(ChordOn(5, CChord::bc_maj).ClosenessToSignKey(aMinor), 2);
-  EXPECT_EQ(ChordOn(2, CChord::bc_maj).ClosenessToSignKey(aMinor), 1);
-}
-
-// ---- Notes and intervals in the key --------------------------------------------------
-
-TEST(ChordInKeyCounts, EveryPitchClassSetInEveryKey) {
-  for (bool major : {true, false})
-    for (int root = 0; root < 12; ++root) {
-      CSignKey key = Key(root, major);
-      for (unsigned set = 1; set < 4096; ++set) {
-        // Each pitch class once, and those divisible by 3 doubled two octaves up.
-        CMySet<int> noteNrs;
-        int in = 0, out = 0, notesOut = 0;
-        for (int pc = 0; pc < 12; ++pc) {
-          if ((set >> pc & 1u) == 0) continue;
-          bool inKey = InKey(pc, root, major);
-          (inKey ? in : out) += 1;
-          noteNrs.insert(48 + pc);
-          notesOut += inKey ? 0 : 1;
-          if (pc % 3 == 0) {
-            noteNrs.insert(72 + pc);
-            notesOut += inKey ? 0 : 1;
-          }
-        }
-        CChord chord;
-        chord.SetFromNoteNrSet(noteNrs);
-        ASSERT_EQ(chord.CountIntvlsInSignKey(key), in) << KeyLabel(root, major) << " set " << set;
-        ASSERT_EQ(chord.CountIntvlsNotInSignKey(key), out) << KeyLabel(root, major) << " set " << set;
-        ASSERT_EQ(chord.CountNotesNotInSignKey(key), notesOut) << KeyLabel(root, major) << " set " << set;
-        ASSERT_EQ(chord.IsInSignKey(key), out == 0) << KeyLabel(root, major) << " set " << set;
-      }
+      CChord chord;
+      chord.SetFromNoteNrSet(noteNrs);
+      ASSERT_EQ(chord.CountIntvlsInSignKey(key), in) << key.Name(DefaultChordnamePref) << " " << set;
+      ASSERT_EQ(chord.CountIntvlsNotInSignKey(key), out) << key.Name(DefaultChordnamePref) << " " << set;
+      ASSERT_EQ(chord.CountNotesNotInSignKey(key), notesOut) << key.Name(DefaultChordnamePref) << " " << set;
+      ASSERT_EQ(chord.IsInSignKey(key), out == 0) << key.Name(DefaultChordnamePref) << " " << set;
     }
-}
-
-TEST(ChordInKeyCounts, EmptyChordIsInEveryKey) {
-  for (bool major : {true, false})
-    for (int root = 0; root < 12; ++root) {
-      CSignKey key = Key(root, major);
-      CChord empty(24);
-      EXPECT_TRUE(empty.IsInSignKey(key)) << KeyLabel(root, major);
-      EXPECT_EQ(empty.CountIntvlsInSignKey(key), 0);
-      EXPECT_EQ(empty.CountIntvlsNotInSignKey(key), 0);
-      EXPECT_EQ(empty.CountNotesNotInSignKey(key), 0);
-      EXPECT_TRUE(CChord_Undef.IsInSignKey(key));
-    }
-}
-
-TEST(ChordInKeyCounts, DoubledNotesCountTwiceOnlyAmongNotes) {
-  CSignKey cMajor = Key(0, true);
-  // D major with F sharp in three octaves.
-  CChord chord = ChordOf({50, 54, 57, 66, 78});
-  EXPECT_EQ(chord.CountNotesNotInSignKey(cMajor), 3);
-  EXPECT_EQ(chord.CountIntvlsNotInSignKey(cMajor), 1);
-  EXPECT_EQ(chord.CountIntvlsInSignKey(cMajor), 2);
-  EXPECT_FALSE(chord.IsInSignKey(cMajor));
-  EXPECT_TRUE(chord.IsInSignKey(Key(2, true)));
-}
-
-TEST(ChordInKeyCounts, IntervalsAboveTheOctaveCountByTheLowestNote) {
-  // Under a root specified first, C sharp an octave up is cached as 13, which no
-  // note's pitch class interval matches: the interval stands for the lowest note,
-  // here C, which is in C major.
-  CChord chord = RootedChord(60, {60, 64, 67, 73});
-  ASSERT_EQ(Members(chord.IntvlSet()), (Intvls{0, 4, 7, 13}));
-  CSignKey cMajor = Key(0, true);
+    EXPECT_TRUE(CChord_Undef.IsInSignKey(key));
+  }
+  // Under a root given first, C sharp an octave up is cached as 13, which no note's
+  // pitch class interval matches: it stands for the lowest note, C, in C major.
+  CChord const chord = RootedChord(60, {60, 64, 67, 73});
+  CSignKey const cMajor(Nat(0), CSignKey::SignKey_Major);
   EXPECT_EQ(chord.CountIntvlsInSignKey(cMajor), 4);
-  EXPECT_TRUE(chord.IsInSignKey(cMajor));
   EXPECT_EQ(chord.CountNotesNotInSignKey(cMajor), 1);
 }
 

@@ -1,53 +1,55 @@
-// The library's own instance of the built-in chord analysis net, as loading leaves
-// it.
+// The built-in chord analysis net: the library's own instance as loading leaves it,
+// and the compiled-in data, which meets the training agent's targets: its given
+// entries bit for bit, its telling chords won clearly, the empty input weakly.
 #include "chord/NetForSingleChordAnalysis.h"
-#include "support/NeuronParamGuard.h"
-
-#include <tonvex/ChordAnalysisNet.h>
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <cstring>
-#include <memory>
-#include <vector>
+#include "nnet/NetTestSupport.h"
+#include "support/TestPrelude.h"
+#include "training/ChordNetTargets.h"
 
 namespace {
 
-// Loading built the net last, so the Neuron parameters are its own (every test
-// restores what it changes).
-TEST(NetForSingleChordAnalysis, LoadingSetsTheNeuronParameters) {
-  EXPECT_EQ(Neuron::input_type, INPUT_SUM);
-  EXPECT_EQ(Neuron::activation_type, ACT_SIGM);
-  EXPECT_EQ(Neuron::output_type, OUTPUT_NONE);
-  EXPECT_EQ(Neuron::combined_type, 0);
-  EXPECT_EQ(Neuron::activation_slope, 0.2f);
-  EXPECT_EQ(Neuron::activation_threshold, 2.0f);
-  EXPECT_EQ(Neuron::output_threshold, 0.0f);
-  EXPECT_EQ(Neuron::flat_spot_elimination, 1);
+using BuiltInNetTest = nettest::NetTest;
+
+std::vector<float> Inputs(std::vector<int> const& set) {
+  std::vector<float> inputs(24, 0.0f);
+  for (int i : set) inputs[static_cast<std::size_t>(i)] = 1.0f;
+  return inputs;
 }
 
-TEST(NetForSingleChordAnalysis, HoldsTheCompiledInNet) {
-  NeuronParamGuard guard;
-  EXPECT_EQ(NetForSingleChordAnalysis.get_input_neuron_count(), 24);
-  EXPECT_EQ(NetForSingleChordAnalysis.get_outputs().size(), 12u);
-
+// Loading built the net last, so the Neuron parameters are its own (every test
+// restores what it changes).
+TEST_F(BuiltInNetTest, LoadingLeavesTheCompiledNetAndItsParameters) {
+  EXPECT_EQ(nettest::NeuronStatics(), std::make_tuple(INPUT_SUM, ACT_SIGM, 0.2f, 2.0f, OUTPUT_NONE, 0.0f));
+  EXPECT_EQ(Neuron::combined_type, 0);
+  EXPECT_EQ(Neuron::flat_spot_elimination, 1);
+  TDynNetProp const& dyn = ChordAnalysisNeuronalNet.dyn;
+  EXPECT_TRUE(ChordAnalysisNeuronalNet.fixed.input_count == 24 && ChordAnalysisNeuronalNet.fixed.output_count == 12 &&
+              dyn.hidden_layer_count == 2 && dyn.hidden_layer_sizes[0] == 15 && dyn.hidden_layer_sizes[1] == 15);
+  EXPECT_EQ(ChordAnalysisNeuronalNet.weights, weight_definitions);
+  EXPECT_EQ(std::size(weight_definitions), 765u);
   TPredefinedWeights record = NetForSingleChordAnalysis.get_weights();
-  const std::unique_ptr<float[]> owned(record.weights);
+  std::unique_ptr<float[]> const owned(record.weights);
   // Field by field: the record has padding before its pointer.
   EXPECT_EQ(std::memcmp(&record.fixed, &ChordAnalysisNeuronalNet.fixed, sizeof(TFixedNetProp)), 0);
   EXPECT_EQ(std::memcmp(&record.dyn, &ChordAnalysisNeuronalNet.dyn, sizeof(TDynNetProp)), 0);
   EXPECT_EQ(std::memcmp(owned.get(), weight_definitions, sizeof weight_definitions), 0);
+}
 
-  // It answers as a net built from the same data.
-  NeuronalNet fresh(ChordAnalysisNeuronalNet, weight_definitions);
-  for (std::vector<int> set : {std::vector<int>{0, 4, 7}, {0, 3, 8}, {0, 5, 9}, {0, 2, 6, 8}, {}}) {
-    std::vector<float> inputs(24, 0.0f);
-    for (int i : set) inputs[static_cast<std::size_t>(i)] = 1.0f;
-    NetForSingleChordAnalysis.use(inputs);
-    fresh.use(inputs);
-    EXPECT_EQ(NetForSingleChordAnalysis.get_outputs(), fresh.get_outputs()) << set.size();
+TEST_F(BuiltInNetTest, CompiledDataMeetsTheTrainingTargets) {
+  for (TChordNetPin const& pin : ChordNetPins)
+    EXPECT_EQ(std::memcmp(&weight_definitions[pin.index], &pin.value, sizeof(float)), 0) << pin.index;
+  NeuronalNet net(ChordAnalysisNeuronalNet, weight_definitions);
+  for (TTellingChord const& chord : TellingChords) {
+    net.use(Inputs(chord.intvls));
+    EXPECT_EQ(net.winner(), chord.winner) << chord.intvls.back();
+    EXPECT_GT(net.get_outputs()[static_cast<std::size_t>(chord.winner)], TellingOutput) << chord.intvls.back();
+    // The library's instance answers alike.
+    NetForSingleChordAnalysis.use(Inputs(chord.intvls));
+    EXPECT_EQ(NetForSingleChordAnalysis.get_outputs(), net.get_outputs());
   }
+  net.use(Inputs({}));
+  EXPECT_EQ(net.winner(), 6);
+  EXPECT_LT(net.get_outputs()[6], EmptyOutputBelow);
 }
 
 } // namespace

@@ -5,10 +5,7 @@
 #ifndef TONVEX_TESTS_NETREFERENCE_H
 #define TONVEX_TESTS_NETREFERENCE_H
 
-#include <tonvex/NeuronalNet.h>
-
-#include <cmath>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace reference {
 

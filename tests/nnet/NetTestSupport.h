@@ -3,14 +3,7 @@
 #define TONVEX_TESTS_NETTESTSUPPORT_H
 
 #include "support/NeuronParamGuard.h"
-
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <memory>
-#include <tuple>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace nettest {
 
@@ -52,35 +45,14 @@ inline std::vector<float> Weights(NeuronalNet& net) {
 inline void SetWeights(NeuronalNet& net, std::vector<float> weights) {
   TPredefinedWeights r = net.get_weights();
   std::unique_ptr<float[]> owned(r.weights);
-  ASSERT_EQ(WeightCount(r), weights.size());
   r.weights = weights.data();
-  ASSERT_TRUE(net.acquire_weights(r));
+  ASSERT_TRUE(WeightCount(r) == weights.size() && net.acquire_weights(r));
 }
 
-/// The Neuron function statics (without flat-spot elimination and combined type),
-/// in the order of TNeuronProp.
+/// The Neuron function statics in the order of TNeuronProp.
 inline auto NeuronStatics() {
   return std::make_tuple(Neuron::input_type, Neuron::activation_type, Neuron::activation_slope,
                          Neuron::activation_threshold, Neuron::output_type, Neuron::output_threshold);
-}
-
-/// Expects the properties of the built-in chord analysis net: 24 inputs, hidden
-/// layers of 15 and 15 (the other sizes 0), 12 outputs, INPUT_SUM, ACT_SIGM with
-/// slope 0.2 and threshold 2, OUTPUT_NONE with threshold 0.
-inline void ExpectChordNetProperties(TFixedNetProp const& fixed, TDynNetProp const& dyn) {
-  EXPECT_EQ(fixed.input_count, 24);
-  EXPECT_EQ(fixed.output_count, 12);
-  EXPECT_EQ(dyn.hidden_layer_count, 2);
-  EXPECT_EQ(dyn.hidden_layer_sizes[0], 15);
-  EXPECT_EQ(dyn.hidden_layer_sizes[1], 15);
-  EXPECT_EQ(dyn.hidden_layer_sizes[2], 0);
-  EXPECT_EQ(dyn.hidden_layer_sizes[3], 0);
-  EXPECT_EQ(dyn.neuron_prop.input_type, INPUT_SUM);
-  EXPECT_EQ(dyn.neuron_prop.activation_type, ACT_SIGM);
-  EXPECT_EQ(dyn.neuron_prop.activation_slope, 0.2f);
-  EXPECT_EQ(dyn.neuron_prop.activation_threshold, 2.0f);
-  EXPECT_EQ(dyn.neuron_prop.output_type, OUTPUT_NONE);
-  EXPECT_EQ(dyn.neuron_prop.output_threshold, 0.0f);
 }
 
 inline std::vector<double> AsDouble(std::vector<float> const& v) { return std::vector<double>(v.begin(), v.end()); }

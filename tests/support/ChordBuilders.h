@@ -2,11 +2,7 @@
 #ifndef TONVEX_TESTS_CHORDBUILDERS_H
 #define TONVEX_TESTS_CHORDBUILDERS_H
 
-#include <tonvex/Chord.h>
-
-#include <set>
-#include <string>
-#include <vector>
+#include "support/TestPrelude.h"
 
 namespace chordtest {
 
@@ -33,9 +29,8 @@ inline CChord RootedChord(long root, std::vector<long> const& noteNrs) {
   return chord;
 }
 
-/// The notes first, then the root specified: the cache is rebuilt from the notes,
-/// folded into one octave, with its lonely-lowest-note mark, as when a host names a
-/// voicing.
+/// The notes first, then the root specified: the next query rebuilds the cache from
+/// the notes, folded into one octave, with its lonely-lowest-note mark.
 inline CChord NotesThenRoot(CNote const& root, std::vector<long> const& noteNrs) {
   CChord chord = ChordOf(noteNrs);
   chord.SetRootNote(root);

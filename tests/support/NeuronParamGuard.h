@@ -3,33 +3,24 @@
 #ifndef TONVEX_TESTS_NEURONPARAMGUARD_H
 #define TONVEX_TESTS_NEURONPARAMGUARD_H
 
-#include <tonvex/Neuron.h>
+#include "support/TestPrelude.h"
+
+/// The statics, in the order of the guard's copy.
+inline auto NeuronStaticsRefs() {
+  return std::tie(Neuron::flat_spot_elimination, Neuron::activation_threshold, Neuron::activation_slope,
+                  Neuron::output_threshold, Neuron::combined_type, Neuron::activation_type, Neuron::output_type,
+                  Neuron::input_type);
+}
 
 class NeuronParamGuard {
 public:
   NeuronParamGuard() = default;
-  ~NeuronParamGuard() {
-    Neuron::flat_spot_elimination = flatSpot_;
-    Neuron::activation_threshold = threshold_;
-    Neuron::activation_slope = slope_;
-    Neuron::output_threshold = outputThreshold_;
-    Neuron::combined_type = combined_;
-    Neuron::activation_type = activation_;
-    Neuron::output_type = output_;
-    Neuron::input_type = input_;
-  }
   NeuronParamGuard(NeuronParamGuard const&) = delete;
   NeuronParamGuard& operator=(NeuronParamGuard const&) = delete;
+  ~NeuronParamGuard() { NeuronStaticsRefs() = saved_; }
 
 private:
-  int flatSpot_ = Neuron::flat_spot_elimination;
-  float threshold_ = Neuron::activation_threshold;
-  float slope_ = Neuron::activation_slope;
-  float outputThreshold_ = Neuron::output_threshold;
-  int combined_ = Neuron::combined_type;
-  ACT_TYPE activation_ = Neuron::activation_type;
-  OUTPUT_TYPE output_ = Neuron::output_type;
-  INPUT_TYPE input_ = Neuron::input_type;
+  std::tuple<int, float, float, float, int, ACT_TYPE, OUTPUT_TYPE, INPUT_TYPE> saved_ = NeuronStaticsRefs();
 };
 
 #endif

@@ -3,49 +3,37 @@
 #ifndef TONVEX_TESTS_PREFGUARD_H
 #define TONVEX_TESTS_PREFGUARD_H
 
-#include <tonvex/ChordnamePref.h>
+#include "support/TestPrelude.h"
 
-#include <array>
+/// Every naming preference.
+inline auto NamingPrefRefs() {
+  using P = CChordnamePref;
+  return std::tie(P::NoteNr_60_is, P::HarmFuncNaming, P::ChordOptionSep, P::PreferSlashChordIfMoreNotesThan,
+                  P::SeparateBlocksInNames, P::PreferSlashChord, P::InversionAsName, P::ShowInversion, P::NoDoubleSigns,
+                  P::NarrowChordsWithoutSlash, P::OmitOptionOfLonelyLowestNoteInWideChord, P::Maj7ShownAs,
+                  P::MinorSmall, P::RomanNames, P::AccidentalsAsLetters, P::Bb_is_B, P::B_is_H);
+}
+
+template <class... T>
+std::tuple<std::remove_reference_t<T>...> Copied(std::tuple<T...> const& refs) {
+  return refs;
+}
 
 class PrefGuard {
 public:
-  PrefGuard() {
-    for (std::size_t i = 0; i < Members.size(); ++i) saved_[i] = *Members[i];
-  }
-  ~PrefGuard() {
-    for (std::size_t i = 0; i < Members.size(); ++i) *Members[i] = saved_[i];
-  }
+  PrefGuard() = default;
   PrefGuard(PrefGuard const&) = delete;
   PrefGuard& operator=(PrefGuard const&) = delete;
+  ~PrefGuard() { NamingPrefRefs() = saved_; }
 
   /// Sets the four note-naming flags at once.
   static void NoteNaming(int roman, int german, int bbIsB, int bIsH) {
-    CChordnamePref::RomanNames = roman;
-    CChordnamePref::AccidentalsAsLetters = german;
-    CChordnamePref::Bb_is_B = bbIsB;
-    CChordnamePref::B_is_H = bIsH;
+    using P = CChordnamePref;
+    std::tie(P::RomanNames, P::AccidentalsAsLetters, P::Bb_is_B, P::B_is_H) = std::tie(roman, german, bbIsB, bIsH);
   }
 
-  static constexpr std::array<int*, 17> Members = {&CChordnamePref::NoteNr_60_is,
-                                                   &CChordnamePref::HarmFuncNaming,
-                                                   &CChordnamePref::ChordOptionSep,
-                                                   &CChordnamePref::PreferSlashChordIfMoreNotesThan,
-                                                   &CChordnamePref::SeparateBlocksInNames,
-                                                   &CChordnamePref::PreferSlashChord,
-                                                   &CChordnamePref::InversionAsName,
-                                                   &CChordnamePref::ShowInversion,
-                                                   &CChordnamePref::NoDoubleSigns,
-                                                   &CChordnamePref::NarrowChordsWithoutSlash,
-                                                   &CChordnamePref::OmitOptionOfLonelyLowestNoteInWideChord,
-                                                   &CChordnamePref::Maj7ShownAs,
-                                                   &CChordnamePref::MinorSmall,
-                                                   &CChordnamePref::RomanNames,
-                                                   &CChordnamePref::AccidentalsAsLetters,
-                                                   &CChordnamePref::Bb_is_B,
-                                                   &CChordnamePref::B_is_H};
-
 private:
-  std::array<int, 17> saved_{};
+  decltype(Copied(NamingPrefRefs())) saved_ = Copied(NamingPrefRefs());
 };
 
 #endif

@@ -3,20 +3,20 @@
 #ifndef TONVEX_TESTS_TEMPFILE_H
 #define TONVEX_TESTS_TEMPFILE_H
 
-#include <gtest/gtest.h>
+#include "support/TestPrelude.h"
 
 #include <filesystem>
 #include <fstream>
 #include <iterator>
-#include <string>
 #include <unistd.h>
 
 class TempFile {
 public:
   explicit TempFile(std::string const& tag = "file") {
     ::testing::TestInfo const* info = ::testing::UnitTest::GetInstance()->current_test_info();
-    path_ = (std::filesystem::temp_directory_path() / ("tonvex_" + std::string(info->test_suite_name()) + "_" +
-                                                       info->name() + "_" + tag + "_" + std::to_string(::getpid())))
+    std::string name = std::string(info->test_suite_name()) + "_" + info->name(); // "/" in parameterised tests
+    std::replace(name.begin(), name.end(), '/', '_');
+    path_ = (std::filesystem::temp_directory_path() / ("tonvex_" + name + "_" + tag + "_" + std::to_string(::getpid())))
                 .string();
   }
   ~TempFile() {
@@ -28,7 +28,6 @@ public:
 
   std::string const& Path() const { return path_; }
   char const* CPath() const { return path_.c_str(); }
-
   void Write(std::string const& text) const { std::ofstream(path_, std::ios::binary) << text; }
   std::string Read() const {
     std::ifstream in(path_, std::ios::binary);

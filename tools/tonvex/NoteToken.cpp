@@ -7,15 +7,6 @@ namespace {
 bool IsDigit(char c) { return c >= '0' && c <= '9'; }
 bool IsLetter(char c) { return (c >= 'A' && c <= 'H') || (c >= 'a' && c <= 'h'); }
 
-// The value of a token that IsDecimalNumber accepted (an optional minus sign and at
-// most nine digits, so it fits an int), read in place.
-int DecimalValue(std::string_view token) {
-  bool const negative = !token.empty() && token[0] == '-';
-  int value = 0;
-  for (std::size_t i = negative ? 1 : 0; i < token.size(); ++i) value = value * 10 + (token[i] - '0');
-  return negative ? -value : value;
-}
-
 bool IsNumberToken(std::string_view token) {
   return !token.empty() && (IsDigit(token[0]) || (token[0] == '-' && token.size() > 1));
 }
@@ -27,6 +18,14 @@ std::string NameWithOctave(long noteNr, TEnh enh) {
 }
 
 } // namespace
+
+// At most nine digits, so the value fits an int.
+int DecimalValue(std::string_view token) {
+  bool const negative = !token.empty() && token[0] == '-';
+  int value = 0;
+  for (std::size_t i = negative ? 1 : 0; i < token.size(); ++i) value = value * 10 + (token[i] - '0');
+  return negative ? -value : value;
+}
 
 bool IsDecimalNumber(std::string_view token) {
   std::size_t i = (!token.empty() && token[0] == '-') ? 1 : 0;

@@ -40,5 +40,7 @@ std::string TokenProblemText(TTokenProblem problem, TTokenKind kind, std::string
 /// Whether the token is a plain decimal number (an optional minus sign and at most
 /// nine digits).
 bool IsDecimalNumber(std::string_view token);
+/// The value of a token that IsDecimalNumber accepts, read the same in every locale.
+int DecimalValue(std::string_view token);
 
 #endif

@@ -9,7 +9,6 @@
 #include <tonvex/SignKey.h>
 
 #include <cstdio>
-#include <cstdlib>
 
 namespace {
 
@@ -20,7 +19,7 @@ constexpr int TypeCount = 8;
 bool ReadScaleType(std::string const& token, CScale::TType& type) {
   int value = -1;
   if (IsDecimalNumber(token))
-    value = std::atoi(token.c_str());
+    value = DecimalValue(token);
   else
     for (int i = 0; i < TypeCount; ++i)
       if (token == TypeNames[i]) value = i;

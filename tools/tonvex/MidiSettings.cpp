@@ -1,5 +1,7 @@
 #include "MidiSettings.h"
 
+#include "NoteToken.h"
+
 #include <charconv>
 #include <cmath>
 #include <string_view>
@@ -12,12 +14,8 @@ std::string_view Trimmed(std::string_view text) {
   return text.substr(first, text.find_last_not_of(" \t") - first + 1);
 }
 
-bool IsNumber(std::string_view text) {
-  if (text.empty()) return false;
-  for (char c : text)
-    if (c < '0' || c > '9') return false;
-  return true;
-}
+// A track index: digits only (nine at most: no file has that many tracks).
+bool IsIndex(std::string_view text) { return IsDecimalNumber(text) && text[0] != '-'; }
 
 // The comma-separated items of an option's value, each without blanks at either end;
 // false if one is empty.
@@ -47,9 +45,8 @@ std::string ReadChannels(std::string const& value, unsigned& channels) {
   bool ok = SplitList(value, items);
   channels = 0;
   for (std::string const& item : items) {
-    int channel = 0;
-    char const* const end = item.data() + item.size();
-    ok = ok && IsNumber(item) && std::from_chars(item.data(), end, channel).ptr == end && channel >= 1 && channel <= 16;
+    int const channel = IsDecimalNumber(item) ? DecimalValue(item) : 0;
+    ok = ok && channel >= 1 && channel <= 16;
     if (ok) channels |= 1u << (channel - 1);
   }
   if (!ok) return "option '--channels' takes channels 1 to 16 separated by commas, not '" + value + "'";
@@ -68,10 +65,8 @@ std::string ReadSeconds(std::string const& value, double& seconds) {
 // Whether a list item names the track: its index, or its name (without blanks at
 // either end).
 bool Names(std::string const& item, std::size_t trackIx, CMidiTrack const& track) {
-  if (!IsNumber(item)) return Trimmed(track.Name) == item;
-  unsigned long index = 0;
-  char const* const end = item.data() + item.size();
-  return std::from_chars(item.data(), end, index).ptr == end && index == trackIx;
+  if (!IsIndex(item)) return Trimmed(track.Name) == item;
+  return static_cast<std::size_t>(DecimalValue(item)) == trackIx;
 }
 
 // Marks the tracks that the list names as named; returns the first item that names none.

@@ -71,17 +71,6 @@ void AppendLab(std::string& out, std::vector<CChordSegment> const& segments) {
   }
 }
 
-void AppendNote(CJsonWriter& json, char const* key, CNote const& note, bool defined) {
-  json.Key(key);
-  if (!defined) return json.Null();
-  json.BeginObject();
-  json.Key("name");
-  json.String(KeyName(note));
-  json.Key("key_number");
-  json.Int(note.NoteNr() % 12);
-  json.EndObject();
-}
-
 void AppendJson(std::string& out, std::vector<CChordSegment> const& segments, std::string const& fileName) {
   for (CChordSegment const& segment : segments) {
     CJsonWriter json(out);
@@ -102,8 +91,8 @@ void AppendJson(std::string& out, std::vector<CChordSegment> const& segments, st
       json.Key(style == Style_Native ? "name" : style == Style_LeadSheet ? "symbol" : "harte");
       json.String(NameOf(segment, style));
     }
-    AppendNote(json, "root", segment.Chord.RootNote(), !segment.NoChord);
-    AppendNote(json, "bass", segment.Chord.LowestNote(), !segment.NoChord);
+    AppendJsonNote(json, "root", segment.Chord.RootNote(), !segment.NoChord);
+    AppendJsonNote(json, "bass", segment.Chord.LowestNote(), !segment.NoChord);
     json.Key("notes");
     json.BeginArray();
     if (!segment.NoChord)

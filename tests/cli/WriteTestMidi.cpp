@@ -4,7 +4,8 @@
 //              plays C, A minor, F, G7 a bar each, track 2 "Bass" (channel 3) E, A,
 //              F, G under it, track 3 "Drums" (channel 10) a hit on every beat for a
 //              bar longer (to 10 seconds)
-//   waltz.mid  format 0, 90 beats per minute in 3/4: D minor, G7, C a bar each
+//   waltz.mid  format 0, 90 beats per minute in 3/4: D minor, G7, C a bar each, and
+//              C again in bar 32 (after a minute)
 //   broken.mid a header and a track chunk that claims more bytes than follow
 // usage: tonvex_write_test_midi DIR
 #include "support/MidiBytes.h"
@@ -44,6 +45,7 @@ Bytes Waltz() {
   track.Tempo(0, 666667).TimeSig(0, 3, 2);
   for (auto const& chord : {std::initializer_list<int>{50, 57, 65}, {43, 59, 65}, {48, 55, 64}})
     track.Chord(0, chord, 3 * Beat);
+  track.Chord(28 * 3 * Beat, {48, 55, 64}, 3 * Beat);
   return MidiFileBytes({track.End()}, 0);
 }
 

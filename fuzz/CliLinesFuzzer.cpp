@@ -26,7 +26,7 @@ ChordSettings Settings(CFuzzInput& in) {
 
 // The midi command's options, and the tracks they select from a file whose track
 // names come from the input.
-void SelectTracks(CFuzzInput& in, CommandLine const& line) {
+void SelectSomeTracks(CFuzzInput& in, CommandLine const& line) {
   CMidiSettings settings;
   if (!ReadMidiSettings(line, settings).empty()) return;
   CMidiFile file;
@@ -44,7 +44,7 @@ void Preferences(CFuzzInput& in) {
   CommandLine line;
   if (ParseCommandLine(args, line).empty()) {
     ApplyNamingPreferences(line);
-    if (line.Command == Cmd_Midi) SelectTracks(in, line);
+    if (line.Command == Cmd_Midi) SelectSomeTracks(in, line);
   } else {
     in.SetPreferences();
   }

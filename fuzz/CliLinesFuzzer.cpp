@@ -1,10 +1,11 @@
 // The command line's batch mode on arbitrary lines, run in-process through the line
 // processing that the program applies to each line of its standard input, and its
-// option parser on arbitrary arguments.
+// option parser on arbitrary arguments, with the midi command's track selection.
 #include "FuzzInput.h"
 
 #include "ChordNamer.h"
 #include "CommandLine.h"
+#include "MidiSettings.h"
 
 #include <string_view>
 
@@ -23,16 +24,30 @@ ChordSettings Settings(CFuzzInput& in) {
   return settings;
 }
 
+// The midi command's options, and the tracks they select from a file whose track
+// names come from the input.
+void SelectSomeTracks(CFuzzInput& in, CommandLine const& line) {
+  CMidiSettings settings;
+  if (!ReadMidiSettings(line, settings).empty()) return;
+  CMidiFile file;
+  for (std::size_t k = in.Count(4); k > 0; --k) file.Tracks.push_back(CMidiTrack{in.Text(8), 0});
+  std::vector<bool> keep;
+  std::string const missing = SelectTracks(file, settings, keep);
+  Require(!missing.empty() || keep.size() == file.Tracks.size());
+}
+
 // Options as a user might type them; when they parse, they set the preferences as
 // the program does, else the preferences are drawn directly.
 void Preferences(CFuzzInput& in) {
   Args args;
   for (std::size_t k = in.Count(4); k > 0; --k) args.push_back(in.Text(24));
   CommandLine line;
-  if (ParseCommandLine(args, line).empty())
+  if (ParseCommandLine(args, line).empty()) {
     ApplyNamingPreferences(line);
-  else
+    if (line.Command == Cmd_Midi) SelectSomeTracks(in, line);
+  } else {
     in.SetPreferences();
+  }
 }
 
 } // namespace

@@ -89,7 +89,7 @@ bool ReadKey(std::string const& text, CSignKey& key) {
 int ReadSettings(CommandLine const& line, ChordSettings& settings) {
   settings.Algo = line.RulesAlgo != 0 ? SCA_RULE_WEIGHTS : SCA_NEURONAL_NET;
   settings.KeyNumbers = line.KeyNumbers != 0;
-  settings.Style = static_cast<TNameStyle>(line.Style);
+  settings.Style = static_cast<TNameStyle>(line.Style < 0 ? Style_Native : line.Style);
   if (!line.Key.empty()) {
     if (!ReadKey(line.Key, settings.Key)) return UsageError(Cmd_Chord, "cannot read key '" + line.Key + "'");
     settings.HasKey = true;
@@ -126,7 +126,7 @@ int NameOneChord(CChordNamer& namer, CommandLine const& line) {
     std::string problem = namer.Read(operand);
     if (problem.empty()) continue;
     if (&operand == &line.Operands.front() && IsWord(operand))
-      problem += " (the commands are note, scale, key and symbol)";
+      problem += " (the commands are note, scale, key, symbol and midi)";
     return UsageError(Cmd_Chord, problem);
   }
   if (namer.Empty()) return UsageError(Cmd_Chord, "no notes given");
@@ -215,6 +215,7 @@ std::string ChordUsage() {
          "  key ROOT [minor]    show a key's name, key signature and degrees\n"
          "  symbol SYMBOL...    read chord symbols (Cmaj7, F#m7b5/C, C:min7/b3) and show\n"
          "                      their notes\n"
+         "  midi FILE...        write the chord timeline of MIDI files\n"
          "Run 'tonvex COMMAND --help' for the options of a command.\n"
          "\n"
          "  --help              show this text\n"

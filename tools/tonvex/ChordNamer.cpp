@@ -35,6 +35,17 @@ void AppendLine(std::string& out, const char* label, std::string const& value) {
 
 } // namespace
 
+void AppendJsonNote(CJsonWriter& json, char const* key, CNote const& note, bool defined) {
+  json.Key(key);
+  if (!defined) return json.Null();
+  json.BeginObject();
+  json.Key("name");
+  json.String(note.KeyName(DefaultChordnamePref));
+  json.Key("key_number");
+  json.Int(note.NoteNr() % 12);
+  json.EndObject();
+}
+
 void CChordNamer::Clear() {
   Notes_.clear();
   KeyNrs_.clear();
@@ -164,14 +175,7 @@ void CChordNamer::AppendJson(std::string& out, long lineNr) const {
     json.EndObject();
   }
   json.EndArray();
-  CNote const root = Chord_.RootNote();
-  json.Key("root");
-  json.BeginObject();
-  json.Key("name");
-  json.String(root.KeyName(DefaultChordnamePref));
-  json.Key("key_number");
-  json.Int(root.NoteNr() % 12);
-  json.EndObject();
+  AppendJsonNote(json, "root", Chord_.RootNote(), true);
   CChord::TBasicChord const bc = Chord_.BasicChord();
   json.Key("basic_chord");
   json.BeginObject();

@@ -12,6 +12,12 @@
 #include <string_view>
 #include <vector>
 
+class CJsonWriter;
+
+/// Writes the member key: the note as {"name", "key_number"}, or null when it is not
+/// defined (no chord).
+void AppendJsonNote(CJsonWriter& json, char const* key, CNote const& note, bool defined);
+
 /// Which name of a chord is shown.
 enum TNameStyle : int { Style_Native = 0, Style_LeadSheet = 1, Style_Harte = 2 };
 

@@ -8,8 +8,9 @@
 
 namespace {
 
-constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key | Cmd_Symbol;
-constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key | Cmd_Symbol;
+constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key | Cmd_Symbol | Cmd_Midi;
+constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key | Cmd_Symbol | Cmd_Midi;
+constexpr unsigned NamedChords = Cmd_Chord | Cmd_Midi;
 
 // An option either stores 1 (a flag), the index of its value among the choices, or
 // its value as text.
@@ -30,18 +31,27 @@ const OptionSpec Options[] = {
     {"--b-is-h", AllCommands, &CommandLine::BIsH, nullptr, nullptr},
     {"--bb-is-b", AllCommands, &CommandLine::BbIsB, nullptr, nullptr},
     {"--octave-of-60", Cmd_Chord | Cmd_Note, &CommandLine::OctaveOf60, "3|4|5", nullptr},
-    {"--minor-small", Cmd_Chord, &CommandLine::MinorSmall, nullptr, nullptr},
-    {"--separate-blocks", Cmd_Chord, &CommandLine::SeparateBlocks, nullptr, nullptr},
-    {"--maj7", Cmd_Chord, &CommandLine::Maj7ShownAs, "ma7|j7|maj7", nullptr},
-    {"--option-sep", Cmd_Chord, &CommandLine::OptionSep, "slash|paren", nullptr},
-    {"--slash", Cmd_Chord, &CommandLine::SlashAlways, "narrow|always", nullptr},
-    {"--no-omit-lonely-bass", Cmd_Chord, &CommandLine::KeepLonelyBass, nullptr, nullptr},
+    {"--minor-small", NamedChords, &CommandLine::MinorSmall, nullptr, nullptr},
+    {"--separate-blocks", NamedChords, &CommandLine::SeparateBlocks, nullptr, nullptr},
+    {"--maj7", NamedChords, &CommandLine::Maj7ShownAs, "ma7|j7|maj7", nullptr},
+    {"--option-sep", NamedChords, &CommandLine::OptionSep, "slash|paren", nullptr},
+    {"--slash", NamedChords, &CommandLine::SlashAlways, "narrow|always", nullptr},
+    {"--no-omit-lonely-bass", NamedChords, &CommandLine::KeepLonelyBass, nullptr, nullptr},
     {"--key", Cmd_Chord, nullptr, nullptr, &CommandLine::Key},
     {"--root", Cmd_Chord, nullptr, nullptr, &CommandLine::Root},
-    {"--algo", Cmd_Chord, &CommandLine::RulesAlgo, "net|rules", nullptr},
+    {"--algo", NamedChords, &CommandLine::RulesAlgo, "net|rules", nullptr},
     {"--key-numbers", Cmd_Chord, &CommandLine::KeyNumbers, nullptr, nullptr},
     {"--json", Cmd_Chord | Cmd_Symbol, &CommandLine::Json, nullptr, nullptr},
-    {"--style", Cmd_Chord, &CommandLine::Style, "native|leadsheet|harte", nullptr},
+    {"--style", NamedChords, &CommandLine::Style, "native|leadsheet|harte", nullptr},
+    {"--format", Cmd_Midi, &CommandLine::Format, "text|lab|json", nullptr},
+    {"--grid", Cmd_Midi, &CommandLine::Grid, "auto|beat|bar", nullptr},
+    {"--include-drums", Cmd_Midi, &CommandLine::IncludeDrums, nullptr, nullptr},
+    {"--tracks", Cmd_Midi, nullptr, nullptr, &CommandLine::Tracks},
+    {"--exclude-tracks", Cmd_Midi, nullptr, nullptr, &CommandLine::ExcludeTracks},
+    {"--channels", Cmd_Midi, nullptr, nullptr, &CommandLine::Channels},
+    {"--min-duration", Cmd_Midi, nullptr, nullptr, &CommandLine::MinDuration},
+    {"-o", Cmd_Midi, nullptr, nullptr, &CommandLine::Output},
+    {"--out-dir", Cmd_Midi, nullptr, nullptr, &CommandLine::OutDir},
 };
 
 OptionSpec const* FindOption(std::string const& name) {
@@ -105,6 +115,7 @@ const char* CommandName(TCommand command) {
   case Cmd_Scale: return "scale";
   case Cmd_Key: return "key";
   case Cmd_Symbol: return "symbol";
+  case Cmd_Midi: return "midi";
   }
   return "";
 }
@@ -155,7 +166,7 @@ std::string ParseCommandLine(Args const& args, CommandLine& line) {
 
   std::size_t first = 0;
   if (!operands.empty()) {
-    for (TCommand command : {Cmd_Note, Cmd_Scale, Cmd_Key, Cmd_Symbol})
+    for (TCommand command : {Cmd_Note, Cmd_Scale, Cmd_Key, Cmd_Symbol, Cmd_Midi})
       if (operands[0] == CommandName(command)) {
         line.Command = command;
         first = 1;

@@ -14,7 +14,14 @@
 using Args = std::vector<std::string>;
 
 /// The commands, as bits so that an option can name the commands it applies to.
-enum TCommand : unsigned { Cmd_Chord = 1u, Cmd_Note = 2u, Cmd_Scale = 4u, Cmd_Key = 8u, Cmd_Symbol = 16u };
+enum TCommand : unsigned {
+  Cmd_Chord = 1u,
+  Cmd_Note = 2u,
+  Cmd_Scale = 4u,
+  Cmd_Key = 8u,
+  Cmd_Symbol = 16u,
+  Cmd_Midi = 32u
+};
 
 struct CommandLine {
   TCommand Command = Cmd_Chord;
@@ -39,10 +46,17 @@ struct CommandLine {
   // Chord settings.
   int RulesAlgo = 0; // 0 the built-in net finds the root, 1 the rules
   int Json = 0;
-  int Style = 0; // the name shown: 0 native, 1 lead-sheet symbol, 2 Harte label
+  int Style = -1; // the name shown: 0 native, 1 lead-sheet symbol, 2 Harte label; -1 not given
   int KeyNumbers = 0;
   std::string Key;  // empty: no key
   std::string Root; // empty: find the root
+
+  // Timeline settings (the midi command), read by ReadMidiSettings.
+  int Format = 0; // 0 text, 1 lab, 2 json
+  int Grid = 0;   // 0 auto, 1 beat, 2 bar (TChordGrid)
+  int IncludeDrums = 0;
+  std::string Tracks, ExcludeTracks, Channels, MinDuration;
+  std::string Output, OutDir; // -o, --out-dir
 };
 
 /// Reads the arguments (without the program name) into line. Returns the empty

@@ -13,6 +13,7 @@ int RunNoteCommand(CommandLine const& line);
 int RunScaleCommand(CommandLine const& line);
 int RunKeyCommand(CommandLine const& line);
 int RunSymbolCommand(CommandLine const& line);
+int RunMidiCommand(CommandLine const& line);
 
 /// The help texts (standard output for --help, standard error after a usage error).
 std::string ChordUsage(); // the program's help: the chord command and the list of commands
@@ -20,6 +21,7 @@ std::string NoteUsage();
 std::string ScaleUsage();
 std::string KeyUsage();
 std::string SymbolUsage();
+std::string MidiUsage();
 
 /// Prints "tonvex[ COMMAND]: <text>" on standard error; returns 2.
 int UsageError(TCommand command, std::string const& text);

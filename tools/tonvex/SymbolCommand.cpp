@@ -1,6 +1,7 @@
 // tonvex symbol SYMBOL...: reads chord symbols (lead-sheet symbols and Harte labels)
 // and shows their notes; without symbols, reads one from every line of standard
 // input.
+#include "ChordNamer.h"
 #include "Commands.h"
 #include "JsonWriter.h"
 
@@ -54,17 +55,6 @@ void AppendFacts(std::string& out, std::string_view symbol, CChord const& chord)
   out += ", root " + KeyName(chord.RootNote()) + ", bass " + KeyName(chord.LowestNote()) + '\n';
 }
 
-void AppendNote(CJsonWriter& json, char const* key, CNote const& note, bool defined) {
-  json.Key(key);
-  if (!defined) return json.Null();
-  json.BeginObject();
-  json.Key("name");
-  json.String(KeyName(note));
-  json.Key("key_number");
-  json.Int(note.NoteNr() % 12);
-  json.EndObject();
-}
-
 void AppendJson(std::string& out, std::string_view symbol, CChord const& chord, long lineNr) {
   CJsonWriter json(out);
   bool const defined = !chord.IsUndefined();
@@ -84,8 +74,8 @@ void AppendJson(std::string& out, std::string_view symbol, CChord const& chord, 
   if (defined)
     for (int keyNr : chord.KeyNrSet()) json.Int(keyNr);
   json.EndArray();
-  AppendNote(json, "root", chord.RootNote(), defined);
-  AppendNote(json, "bass", chord.LowestNote(), defined);
+  AppendJsonNote(json, "root", chord.RootNote(), defined);
+  AppendJsonNote(json, "bass", chord.LowestNote(), defined);
   json.EndObject();
   out += '\n';
 }

@@ -19,6 +19,7 @@ std::string UsageOf(TCommand command) {
   case Cmd_Scale: return ScaleUsage();
   case Cmd_Key: return KeyUsage();
   case Cmd_Symbol: return SymbolUsage();
+  case Cmd_Midi: return MidiUsage();
   case Cmd_Chord: break;
   }
   return ChordUsage();
@@ -44,6 +45,7 @@ int main(int argc, char** argv) {
   case Cmd_Scale: return RunScaleCommand(line);
   case Cmd_Key: return RunKeyCommand(line);
   case Cmd_Symbol: return RunSymbolCommand(line);
+  case Cmd_Midi: return RunMidiCommand(line);
   case Cmd_Chord: break;
   }
   return RunChordCommand(line);

@@ -1,6 +1,7 @@
 // tonvex midi [OPTIONS] FILE...: the chord timeline of each MIDI file.
 #include "Commands.h"
 #include "MidiSettings.h"
+#include "QuotedText.h"
 #include "TimelineWriter.h"
 
 #include <algorithm>
@@ -47,7 +48,7 @@ std::string WriteFile(std::string const& path, std::string const& text) {
     written = false;
     error = errno;
   }
-  return written ? std::string() : "cannot write '" + path + "': " + std::strerror(error);
+  return written ? std::string() : "cannot write " + Quoted(path, PathCharacters) + ": " + std::strerror(error);
 }
 
 const char* Extension(TTimelineFormat format) {
@@ -118,9 +119,9 @@ std::vector<CChordSegment> Timeline(CMidiFile const& file, CMidiSettings const& 
   return kept;
 }
 
-// Prints "tonvex midi: FILE: PROBLEM" on standard error; returns status.
+// Prints "tonvex midi: 'FILE': PROBLEM" on standard error; returns status.
 int FileProblem(std::string const& path, std::string const& problem, int status) {
-  std::fprintf(stderr, "tonvex midi: %s: %s\n", path.c_str(), problem.c_str());
+  PrintProblem(Cmd_Midi, Quoted(path, PathCharacters) + ": " + problem);
   return status;
 }
 
@@ -191,14 +192,14 @@ std::string MidiUsage() {
          "\n"
          "Exit status: 0 success; 1 a file could not be read or written; 2 a usage error,\n"
          "or a name or index in --tracks or --exclude-tracks that a file has no track for\n"
-         "(the other files go on).\n";
+         "(the other files go on).\n"
+         "\n"
+         "Other options:\n" +
+         GeneralOptionsHelp;
 }
 
 int RunMidiCommand(CommandLine const& line) {
-  if (line.Operands.empty()) {
-    std::fputs(MidiUsage().c_str(), stderr);
-    return 2;
-  }
+  if (line.Operands.empty()) return ShortUsage(Cmd_Midi);
   CMidiSettings settings;
   std::string const problem = ReadMidiSettings(line, settings);
   if (!problem.empty()) return UsageError(Cmd_Midi, problem);
@@ -206,7 +207,7 @@ int RunMidiCommand(CommandLine const& line) {
     std::set<std::string> paths;
     for (std::string const& input : line.Operands)
       if (!paths.insert(OutputPath(input, settings)).second)
-        return UsageError(Cmd_Midi, "two files would be written to '" + OutputPath(input, settings) + "'");
+        return UsageError(Cmd_Midi, "two files would be written to " + Quoted(OutputPath(input, settings), PathCharacters));
   }
   bool const toStdout = settings.Output.empty() && settings.OutDir.empty();
   bool const several = line.Operands.size() > 1;
@@ -228,7 +229,7 @@ int RunMidiCommand(CommandLine const& line) {
     if (std::fwrite(text.data(), 1, text.size(), stdout) != text.size()) break;
   }
   if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
-    std::fputs("tonvex midi: cannot write the output\n", stderr);
+    PrintProblem(Cmd_Midi, "cannot write the output");
     return std::max(status, 1);
   }
   return status;

@@ -1,6 +1,7 @@
 #include "MidiSettings.h"
 
 #include "NoteToken.h"
+#include "QuotedText.h"
 
 #include <charconv>
 #include <cmath>
@@ -35,7 +36,7 @@ std::string ReadTrackList(const char* option, std::string const& value, CTrackLi
   if (value.empty()) return std::string();
   list.Given = true;
   if (!SplitList(value, list.Items))
-    return std::string("option '") + option + "' takes track names or indices separated by commas, not '" + value + "'";
+    return std::string("option '") + option + "' takes track names or indices separated by commas, not " + Quoted(value);
   return std::string();
 }
 
@@ -49,7 +50,7 @@ std::string ReadChannels(std::string const& value, unsigned& channels) {
     ok = ok && channel >= 1 && channel <= 16;
     if (ok) channels |= 1u << (channel - 1);
   }
-  if (!ok) return "option '--channels' takes channels 1 to 16 separated by commas, not '" + value + "'";
+  if (!ok) return "option '--channels' takes channels 1 to 16 separated by commas, not " + Quoted(value);
   return std::string();
 }
 
@@ -58,7 +59,7 @@ std::string ReadSeconds(std::string const& value, double& seconds) {
   char const* const end = value.data() + value.size();
   auto const read = std::from_chars(value.data(), end, seconds);
   if (read.ec != std::errc() || read.ptr != end || !std::isfinite(seconds) || seconds < 0)
-    return "option '--min-duration' takes seconds (a number, 0 or more), not '" + value + "'";
+    return "option '--min-duration' takes seconds (a number, 0 or more), not " + Quoted(value);
   return std::string();
 }
 
@@ -108,10 +109,10 @@ std::string SelectTracks(CMidiFile const& file, CMidiSettings const& settings, s
   std::vector<bool> excluded;
   std::string missing;
   if (settings.Tracks.Given && !(missing = MarkTracks(file, settings.Tracks, keep)).empty())
-    return "no track '" + missing + "' (--tracks)";
+    return "no track " + Quoted(missing) + " (--tracks)";
   if (!settings.Tracks.Given) keep.assign(file.Tracks.size(), true);
   if (!(missing = MarkTracks(file, settings.ExcludedTracks, excluded)).empty())
-    return "no track '" + missing + "' (--exclude-tracks)";
+    return "no track " + Quoted(missing) + " (--exclude-tracks)";
   for (std::size_t t = 0; t < keep.size(); ++t) keep[t] = keep[t] && !excluded[t];
   return std::string();
 }

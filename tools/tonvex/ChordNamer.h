@@ -73,8 +73,7 @@ public:
   /// or with `json` the JSON object carrying lineNr, and a line end to out. Returns
   /// the empty string, or the problem with the line's first token that is not a
   /// note and that token; then nothing is appended.
-  std::string Handle(std::string_view line, long lineNr, bool json, std::string& out,
-                     std::string_view& token) override;
+  std::string Handle(std::string_view line, long lineNr, bool json, std::string& out, std::string_view& token) override;
 
 private:
   std::string NoteName(CNote const& note) const;

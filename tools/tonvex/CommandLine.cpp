@@ -227,8 +227,8 @@ std::string ParseCommandLine(Args const& args, CommandLine& line) {
     // hide a mistake.
     for (std::size_t earlier = 0; earlier < k && stored.empty(); ++earlier)
       if (given[earlier].Spec == option.Spec && given[earlier].Value != option.Value)
-        stored = std::string("option '") + option.Spec->Name + "' is given twice, as " +
-                 Quoted(given[earlier].Value) + " and as " + Quoted(option.Value);
+        stored = std::string("option '") + option.Spec->Name + "' is given twice, as " + Quoted(given[earlier].Value) +
+                 " and as " + Quoted(option.Value);
     if (problem.empty()) problem = stored;
   }
   if (problem.empty() && line.German != 0 && line.Solfege != 0)

@@ -123,8 +123,7 @@ void WriteCompletion(std::ostream& out) {
       for (char& c : words) c = c == '|' ? ' ' : c;
       choices << "  " << option.Name << ") COMPREPLY=($(compgen -W \"" << words << "\" -- \"$cur\")); return ;;\n";
     }
-    options << "  " << (command == Cmd_Chord ? "chord" : CommandName(command)) << ") options=\"" << list
-            << "\" ;;\n";
+    options << "  " << (command == Cmd_Chord ? "chord" : CommandName(command)) << ") options=\"" << list << "\" ;;\n";
   }
   std::string commandWords = Pattern(commands);
   for (char& c : commandWords) c = c == '|' ? ' ' : c;

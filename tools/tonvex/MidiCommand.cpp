@@ -207,7 +207,8 @@ int RunMidiCommand(CommandLine const& line) {
     std::set<std::string> paths;
     for (std::string const& input : line.Operands)
       if (!paths.insert(OutputPath(input, settings)).second)
-        return UsageError(Cmd_Midi, "two files would be written to " + Quoted(OutputPath(input, settings), PathCharacters));
+        return UsageError(Cmd_Midi,
+                          "two files would be written to " + Quoted(OutputPath(input, settings), PathCharacters));
   }
   bool const toStdout = settings.Output.empty() && settings.OutDir.empty();
   bool const several = line.Operands.size() > 1;

@@ -36,7 +36,8 @@ std::string ReadTrackList(const char* option, std::string const& value, CTrackLi
   if (value.empty()) return std::string();
   list.Given = true;
   if (!SplitList(value, list.Items))
-    return std::string("option '") + option + "' takes track names or indices separated by commas, not " + Quoted(value);
+    return std::string("option '") + option + "' takes track names or indices separated by commas, not " +
+           Quoted(value);
   return std::string();
 }
 

@@ -50,7 +50,8 @@ std::vector<CNoteNameEntry> NamesOfStyle(int roman, int german, std::vector<CNot
 std::vector<CNoteNameEntry> const& GermanNames() {
   // The library writes B sharp "Bis" and the double flats "Eeses" and "Aeses".
   static std::vector<CNoteNameEntry> const names = NamesOfStyle(
-      0, 1, {{"His", 0, Enh_Sharp}, {"Hisis", 1, Enh_DoubleSharp}, {"Eses", 2, Enh_DoubleFlat}, {"Ases", 7, Enh_DoubleFlat}});
+      0, 1,
+      {{"His", 0, Enh_Sharp}, {"Hisis", 1, Enh_DoubleSharp}, {"Eses", 2, Enh_DoubleFlat}, {"Ases", 7, Enh_DoubleFlat}});
   return names;
 }
 
@@ -116,7 +117,7 @@ std::string_view WithPlainSigns(std::string_view text, std::string& buffer) {
 
 std::size_t ReadNoteNameAtStart(std::string_view text, CNote& note, bool (*restFits)(std::string_view rest)) {
   // Solfège wins over German, as in the library's names.
-  std::vector<CNoteNameEntry> const* names = CChordnamePref::RomanNames            ? &SolfegeNames()
+  std::vector<CNoteNameEntry> const* names = CChordnamePref::RomanNames             ? &SolfegeNames()
                                              : CChordnamePref::AccidentalsAsLetters ? &GermanNames()
                                                                                     : nullptr;
   CNote read;

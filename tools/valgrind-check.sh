@@ -28,7 +28,7 @@ if grep -q '^TONVEX_SANITIZE:STRING=.\+' "$build/CMakeCache.txt"; then
   echo "$build is a sanitizer build; valgrind needs a build without sanitizers" >&2
   exit 2
 fi
-cmake --build "$build" --target tonvex_tests tonvex_internal_tests tonvex_cli tonvex_xor_example
+cmake --build "$build" --target tonvex_tests tonvex_internal_tests tonvex_cli tonvex_write_test_midi tonvex_xor_example
 
 memcheck="valgrind --quiet --error-exitcode=99 --leak-check=full --show-leak-kinds=definite,indirect,possible"
 memcheck+=" --errors-for-leak-kinds=definite,indirect,possible"

@@ -58,8 +58,13 @@
 //
 // Everything is bounded by the number of notes: the work is O(n log n) plus a
 // constant per unit and pitch class. Nothing here throws (apart from std::bad_alloc).
-// Root finding by net uses the library's one built-in net: do not analyse on two
-// threads at once.
+//
+// Threads: an analysis keeps all its state in the call (it only reads its arguments
+// and returns new segments) and finds roots as Chord.h's thread-safe chords do, so
+// any number of threads may analyse at once, different inputs or the same ones,
+// while no thread changes what Chord.h names as unsafe meanwhile: a naming
+// preference, or the neuron parameters (building, copying or training a NeuronalNet).
+// ReadMidiFile, CMidiTimeMap and the conversions below share nothing either.
 #ifndef TONVEX_CHORDTIMELINE_H
 #define TONVEX_CHORDTIMELINE_H
 

@@ -33,8 +33,13 @@ check(run(["--algo", "rules"], CHORDS) == (1, "\n".join(NAMES) + "\n", BAD_LINE)
 status, out, err = run(["--algo", "rules", "--json", "--key", "C"], CHORDS)
 objects = [json.loads(line) for line in out.splitlines()]
 check((status, err) == (1, BAD_LINE), "json: status %d, stderr %r" % (status, err))
+# The line that cannot be read has an object in its place, so that the output stays
+# aligned with the input.
+check(objects[2] == {"line": 5, "error": "cannot read note 'H#x'", "token": "H#x"}, "json error %r" % objects[2])
+del objects[2]
 check([(o["line"], o["name"]) for o in objects] == list(zip([2, 4, 6, 7, 8], NAMES)), "json lines %r" % out)
-check(objects[0] == {"line": 2, "name": "C  7", "symbol": "C7", "harte": "C:7", "root": {"name": "C", "key_number": 0}, "notes": [
+check(objects[0] == {"line": 2, "name": "C  7", "symbol": "C7", "harte": "C:7", "root": {"name": "C", "key_number": 0},
+                     "bass": {"name": "C", "key_number": 0}, "inversion": None, "notes": [
     {"name": "C4", "number": 72}, {"name": "E4", "number": 76}, {"name": "G4", "number": 79},
     {"name": "Bb4", "number": 82}], "basic_chord": {"number": 1, "name": "", "kind": "major"}, "options": ["7"],
     "xg_chord_type": 19, "signs": 0, "key": {"name": "C", "signs": 0, "function": "I", "functional": "T",
@@ -42,6 +47,14 @@ check(objects[0] == {"line": 2, "name": "C  7", "symbol": "C7", "harte": "C:7", 
       "json C7 %r" % objects[0])
 check(objects[1]["basic_chord"]["kind"] == "minor" and objects[1]["key"]["functional"] == "Tp", "json Am7")
 check(objects[4]["signs"] == 2 and objects[4]["key"]["function"] == "II", "json D %r" % objects[4])
+check((objects[3]["bass"], objects[3]["inversion"]) == ({"name": "E", "key_number": 4}, 4), "json C/E %r" % objects[3])
+# Key numbers say so; symbols read from lines get error objects too.
+status, out, err = run(["--json", "--key-numbers", "--algo", "rules", "0", "4", "7"])
+check(json.loads(out)["notes"][1] == {"name": "E", "key_number": 4}, "key numbers %r" % out)
+status, out, err = run(["symbol", "--json"], "Am7\nCmaj7x9\n")
+check(status == 1 and [json.loads(line) for line in out.splitlines()][1] == {
+    "line": 2, "error": "cannot read chord symbol 'Cmaj7x9': unexpected text at offset 5 ('x9')", "token": "Cmaj7x9"},
+    "symbol error %r" % out)
 # One chord from the command line: one object, without a line number; German names.
 status, out, err = run(["--german", "--json", "--algo", "rules", "--key", "Eb", "Bb3", "D4", "F4", "Ab4"])
 single = json.loads(out)

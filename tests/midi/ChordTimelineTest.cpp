@@ -8,6 +8,7 @@
 
 #include <cstdio>
 #include <string>
+#include <thread>
 #include <vector>
 
 namespace {
@@ -165,6 +166,31 @@ TEST(ChordTimelineTest, MinDurationJoinsShortSegments) {
   CChordTimelineSettings joined;
   joined.MinDuration = 1.5;
   EXPECT_EQ(Timeline(song, joined), "0.00-5.00 C  @1:1|");
+}
+
+// The analysis keeps no state outside its call: threads that analyse songs at the
+// same time, by net and by rules, get the timelines one thread gets alone. The
+// ThreadSanitizer build (.ci/run) runs this test to find any data race on the way.
+TEST(ConcurrentAnalysis, TimelinesOnFourThreads) {
+  std::vector<Bytes> const songs = {MidiFileBytes({Conductor(), BlockChords(CAmFG), Melody()}),
+                                    MidiFileBytes({Conductor(600000), BlockChords(CAmFG, Beat)})};
+  CChordTimelineSettings byRules;
+  byRules.Algo = SCA_RULE_WEIGHTS;
+  std::vector<CChordTimelineSettings> const settings = {CChordTimelineSettings(), byRules};
+  std::vector<std::string> expected;
+  for (Bytes const& song : songs)
+    for (CChordTimelineSettings const& s : settings) expected.push_back(Timeline(song, s));
+  std::vector<int> mismatches(4, 0);
+  std::vector<std::thread> threads;
+  for (std::size_t t = 0; t < mismatches.size(); ++t)
+    threads.emplace_back([&, t] {
+      for (std::size_t k = 0; k < 40; ++k) {
+        std::size_t const i = (t + k) % expected.size();
+        if (Timeline(songs[i / 2], settings[i % 2]) != expected[i]) ++mismatches[t];
+      }
+    });
+  for (std::thread& thread : threads) thread.join();
+  for (int count : mismatches) EXPECT_EQ(count, 0);
 }
 
 } // namespace

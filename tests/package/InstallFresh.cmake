@@ -1,6 +1,7 @@
 # Installs the build tree into an empty PREFIX and checks that exactly the package
 # lands there: headers, the shared library with its version links, the CMake
-# package, tonvex.pc and (WITH_PROGRAM) the program; nothing internal.
+# package, tonvex.pc and (WITH_PROGRAM) the program with its man page and bash
+# completion; nothing internal.
 cmake_minimum_required(VERSION 3.25)
 include(${CMAKE_CURRENT_LIST_DIR}/PackageTestSupport.cmake)
 
@@ -17,7 +18,7 @@ set(expected
   ${LIBDIR}/cmake/Tonvex/TonvexTargets.cmake ${LIBDIR}/cmake/Tonvex/TonvexTargets-${config}.cmake
   ${LIBDIR}/pkgconfig/tonvex.pc)
 if(WITH_PROGRAM)
-  list(APPEND expected ${BINDIR}/tonvex)
+  list(APPEND expected ${BINDIR}/tonvex ${MANDIR}/man1/tonvex.1 ${DATADIR}/bash-completion/completions/tonvex)
 endif()
 file(GLOB headers RELATIVE "${SOURCE_DIR}/include" "${SOURCE_DIR}/include/tonvex/*.h")
 foreach(header IN LISTS headers)

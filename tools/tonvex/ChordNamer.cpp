@@ -35,6 +35,17 @@ void AppendLine(std::string& out, const char* label, std::string const& value) {
 
 } // namespace
 
+void AppendJsonNote(CJsonWriter& json, char const* key, CNote const& note, bool defined) {
+  json.Key(key);
+  if (!defined) return json.Null();
+  json.BeginObject();
+  json.Key("name");
+  json.String(note.KeyName(DefaultChordnamePref));
+  json.Key("key_number");
+  json.Int(note.NoteNr() % 12);
+  json.EndObject();
+}
+
 void CChordNamer::Clear() {
   Notes_.clear();
   KeyNrs_.clear();
@@ -42,7 +53,7 @@ void CChordNamer::Clear() {
 
 bool CChordNamer::Empty() const { return Notes_.empty() && KeyNrs_.empty(); }
 
-std::string CChordNamer::Read(std::string_view text) {
+std::string CChordNamer::Read(std::string_view text, std::string_view& token) {
   std::size_t pos = 0;
   while (pos < text.size()) {
     if (IsSeparator(text[pos])) {
@@ -52,7 +63,7 @@ std::string CChordNamer::Read(std::string_view text) {
     if (text[pos] == '#') break;
     std::size_t end = pos;
     while (end < text.size() && !IsSeparator(text[end])) ++end;
-    std::string_view const token = text.substr(pos, end - pos);
+    token = text.substr(pos, end - pos);
     pos = end;
     if (Settings_.KeyNumbers) {
       int keyNr = 0;
@@ -159,19 +170,22 @@ void CChordNamer::AppendJson(std::string& out, long lineNr) const {
     json.BeginObject();
     json.Key("name");
     json.String(NoteName(note));
-    json.Key("number");
+    // Key numbers stand for pitch classes, not for the note numbers they also are.
+    json.Key(Settings_.KeyNumbers ? "key_number" : "number");
     json.Int(note.NoteNr());
     json.EndObject();
   }
   json.EndArray();
-  CNote const root = Chord_.RootNote();
-  json.Key("root");
-  json.BeginObject();
-  json.Key("name");
-  json.String(root.KeyName(DefaultChordnamePref));
-  json.Key("key_number");
-  json.Int(root.NoteNr() % 12);
-  json.EndObject();
+  CNote const root = Chord_.RootNote(), bass = Chord_.LowestNote();
+  AppendJsonNote(json, "root", root, true);
+  AppendJsonNote(json, "bass", bass, true);
+  // Root position has no inversion; else the bass's interval above the root.
+  int const inversion = AbsKeyIntvlFromTo(root, bass);
+  json.Key("inversion");
+  if (inversion == 0)
+    json.Null();
+  else
+    json.Int(inversion);
   CChord::TBasicChord const bc = Chord_.BasicChord();
   json.Key("basic_chord");
   json.BeginObject();
@@ -218,9 +232,10 @@ void CChordNamer::AppendJson(std::string& out, long lineNr) const {
   json.EndObject();
 }
 
-std::string CChordNamer::NameLine(std::string_view line, long lineNr, bool json, std::string& out) {
+std::string CChordNamer::Handle(std::string_view line, long lineNr, bool json, std::string& out,
+                                std::string_view& token) {
   Clear();
-  std::string problem = Read(line);
+  std::string problem = Read(line, token);
   if (!problem.empty() || Empty()) return problem;
   Analyse();
   if (json)

@@ -5,12 +5,20 @@
 #ifndef TONVEX_TOOLS_CHORDNAMER_H
 #define TONVEX_TOOLS_CHORDNAMER_H
 
+#include "LineLoop.h"
+
 #include <tonvex/Chord.h>
 #include <tonvex/SignKey.h>
 
 #include <string>
 #include <string_view>
 #include <vector>
+
+class CJsonWriter;
+
+/// Writes the member key: the note as {"name", "key_number"}, or null when it is not
+/// defined (no chord).
+void AppendJsonNote(CJsonWriter& json, char const* key, CNote const& note, bool defined);
 
 /// Which name of a chord is shown.
 enum TNameStyle : int { Style_Native = 0, Style_LeadSheet = 1, Style_Harte = 2 };
@@ -30,7 +38,7 @@ struct ChordSettings {
   TNameStyle Style = Style_Native;
 };
 
-class CChordNamer {
+class CChordNamer : public CLineHandler {
 public:
   explicit CChordNamer(ChordSettings const& settings) : Settings_(settings) {}
 
@@ -39,8 +47,8 @@ public:
   /// Reads the notes in text: tokens separated by blanks, tabs or commas; a token
   /// starting with '#' begins a comment that runs to the end of the text. Returns
   /// the empty string, or the problem with the first token that is not a note
-  /// ("cannot read note 'X9'"); the notes before it stay read.
-  std::string Read(std::string_view text);
+  /// ("cannot read note 'X9'") and that token; the notes before it stay read.
+  std::string Read(std::string_view text, std::string_view& token);
   /// Whether no note has been read since Clear.
   bool Empty() const;
 
@@ -56,15 +64,16 @@ public:
   /// chord type, signs and, with a key, the facts of the chord in the key.
   void AppendReport(std::string& out) const;
   /// One JSON object (no line end) with the same facts, the name, the lead-sheet
-  /// symbol and the Harte label; a line number above 0 is written first as "line".
+  /// symbol and the Harte label, the bass and the inversion; a line number above 0
+  /// is written first as "line".
   void AppendJson(std::string& out, long lineNr) const;
 
   /// Names the chord of one line of input, as the batch mode does: reads it
   /// (forgetting the notes before), and unless it holds no notes appends the shown name,
   /// or with `json` the JSON object carrying lineNr, and a line end to out. Returns
   /// the empty string, or the problem with the line's first token that is not a
-  /// note; then nothing is appended.
-  std::string NameLine(std::string_view line, long lineNr, bool json, std::string& out);
+  /// note and that token; then nothing is appended.
+  std::string Handle(std::string_view line, long lineNr, bool json, std::string& out, std::string_view& token) override;
 
 private:
   std::string NoteName(CNote const& note) const;

@@ -1,15 +1,19 @@
 #include "CommandLine.h"
 #include "Commands.h"
+#include "QuotedText.h"
 
 #include <tonvex/ChordnamePref.h>
+#include <tonvex/TonvexVersion.h>
 
+#include <charconv>
 #include <cstdio>
 #include <cstring>
 
 namespace {
 
-constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key | Cmd_Symbol;
-constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key | Cmd_Symbol;
+constexpr unsigned AllCommands = Cmd_Chord | Cmd_Note | Cmd_Scale | Cmd_Key | Cmd_Symbol | Cmd_Midi;
+constexpr unsigned NamedNotes = Cmd_Chord | Cmd_Scale | Cmd_Key | Cmd_Symbol | Cmd_Midi;
+constexpr unsigned NamedChords = Cmd_Chord | Cmd_Midi;
 
 // An option either stores 1 (a flag), the index of its value among the choices, or
 // its value as text.
@@ -30,18 +34,28 @@ const OptionSpec Options[] = {
     {"--b-is-h", AllCommands, &CommandLine::BIsH, nullptr, nullptr},
     {"--bb-is-b", AllCommands, &CommandLine::BbIsB, nullptr, nullptr},
     {"--octave-of-60", Cmd_Chord | Cmd_Note, &CommandLine::OctaveOf60, "3|4|5", nullptr},
-    {"--minor-small", Cmd_Chord, &CommandLine::MinorSmall, nullptr, nullptr},
-    {"--separate-blocks", Cmd_Chord, &CommandLine::SeparateBlocks, nullptr, nullptr},
-    {"--maj7", Cmd_Chord, &CommandLine::Maj7ShownAs, "ma7|j7|maj7", nullptr},
-    {"--option-sep", Cmd_Chord, &CommandLine::OptionSep, "slash|paren", nullptr},
-    {"--slash", Cmd_Chord, &CommandLine::SlashAlways, "narrow|always", nullptr},
-    {"--no-omit-lonely-bass", Cmd_Chord, &CommandLine::KeepLonelyBass, nullptr, nullptr},
+    {"--minor-small", NamedChords, &CommandLine::MinorSmall, nullptr, nullptr},
+    {"--separate-blocks", NamedChords, &CommandLine::SeparateBlocks, nullptr, nullptr},
+    {"--maj7", NamedChords, &CommandLine::Maj7ShownAs, "ma7|j7|maj7", nullptr},
+    {"--option-sep", NamedChords, &CommandLine::OptionSep, "slash|paren", nullptr},
+    {"--slash", NamedChords, &CommandLine::SlashAlways, "narrow|always", nullptr},
+    {"--no-omit-lonely-bass", NamedChords, &CommandLine::KeepLonelyBass, nullptr, nullptr},
     {"--key", Cmd_Chord, nullptr, nullptr, &CommandLine::Key},
     {"--root", Cmd_Chord, nullptr, nullptr, &CommandLine::Root},
-    {"--algo", Cmd_Chord, &CommandLine::RulesAlgo, "net|rules", nullptr},
+    {"--algo", NamedChords, &CommandLine::RulesAlgo, "net|rules", nullptr},
     {"--key-numbers", Cmd_Chord, &CommandLine::KeyNumbers, nullptr, nullptr},
     {"--json", Cmd_Chord | Cmd_Symbol, &CommandLine::Json, nullptr, nullptr},
-    {"--style", Cmd_Chord, &CommandLine::Style, "native|leadsheet|harte", nullptr},
+    {"--line-buffered", Cmd_Chord | Cmd_Symbol, &CommandLine::LineBuffered, nullptr, nullptr},
+    {"--style", NamedChords, &CommandLine::Style, "native|leadsheet|harte", nullptr},
+    {"--format", Cmd_Midi, &CommandLine::Format, "text|lab|json", nullptr},
+    {"--grid", Cmd_Midi, &CommandLine::Grid, "auto|beat|bar", nullptr},
+    {"--include-drums", Cmd_Midi, &CommandLine::IncludeDrums, nullptr, nullptr},
+    {"--tracks", Cmd_Midi, nullptr, nullptr, &CommandLine::Tracks},
+    {"--exclude-tracks", Cmd_Midi, nullptr, nullptr, &CommandLine::ExcludeTracks},
+    {"--channels", Cmd_Midi, nullptr, nullptr, &CommandLine::Channels},
+    {"--min-duration", Cmd_Midi, nullptr, nullptr, &CommandLine::MinDuration},
+    {"-o", Cmd_Midi, nullptr, nullptr, &CommandLine::Output},
+    {"--out-dir", Cmd_Midi, nullptr, nullptr, &CommandLine::OutDir},
 };
 
 OptionSpec const* FindOption(std::string const& name) {
@@ -87,8 +101,8 @@ std::string StoreOption(GivenOption const& given, CommandLine& line) {
   } else if (spec.Choices != nullptr) {
     int index = ChoiceIndex(spec.Choices, given.Value);
     if (index < 0)
-      return std::string("option '") + spec.Name + "' takes " + ChoiceList(spec.Choices) + ", not '" + given.Value +
-             "'";
+      return std::string("option '") + spec.Name + "' takes " + ChoiceList(spec.Choices) + ", not " +
+             Quoted(given.Value);
     line.*spec.Setting = index;
   } else {
     line.*spec.Setting = 1;
@@ -105,14 +119,53 @@ const char* CommandName(TCommand command) {
   case Cmd_Scale: return "scale";
   case Cmd_Key: return "key";
   case Cmd_Symbol: return "symbol";
+  case Cmd_Midi: return "midi";
   }
   return "";
 }
 
-int UsageError(TCommand command, std::string const& text) {
+void PrintProblem(TCommand command, std::string const& text) {
   const char* name = CommandName(command);
   std::fprintf(stderr, "tonvex%s%s: %s\n", *name != '\0' ? " " : "", name, text.c_str());
+}
+
+std::string ProgramVersion() {
+  char text[32];
+  auto const written = std::to_chars(text, text + sizeof text, TonvexVersionNumber);
+  return std::string(text, written.ptr);
+}
+
+std::string UsageOf(TCommand command) {
+  switch (command) {
+  case Cmd_Note: return NoteUsage();
+  case Cmd_Scale: return ScaleUsage();
+  case Cmd_Key: return KeyUsage();
+  case Cmd_Symbol: return SymbolUsage();
+  case Cmd_Midi: return MidiUsage();
+  case Cmd_Chord: break;
+  }
+  return ChordUsage();
+}
+
+int ShortUsage(TCommand command) {
+  std::string const help = UsageOf(command);
+  const char* name = CommandName(command);
+  std::fprintf(stderr, "%sRun 'tonvex%s%s --help' for more.\n", help.substr(0, help.find("\n\n") + 1).c_str(),
+               *name != '\0' ? " " : "", name);
   return 2;
+}
+
+int UsageError(TCommand command, std::string const& text) {
+  PrintProblem(command, text);
+  return 2;
+}
+
+std::vector<COptionInfo> OptionsOf(TCommand command) {
+  std::vector<COptionInfo> options;
+  for (OptionSpec const& spec : Options)
+    if ((spec.Commands & command) != 0)
+      options.push_back({spec.Name, spec.Choices != nullptr ? spec.Choices : "", TakesValue(spec)});
+  return options;
 }
 
 std::string ParseCommandLine(Args const& args, CommandLine& line) {
@@ -136,7 +189,7 @@ std::string ParseCommandLine(Args const& args, CommandLine& line) {
     std::string name = arg.substr(0, equals);
     OptionSpec const* spec = FindOption(name);
     if (spec == nullptr) {
-      if (problem.empty()) problem = "unknown option '" + name + "'";
+      if (problem.empty()) problem = "unknown option " + Quoted(name);
       continue;
     }
     GivenOption option{spec, std::string()};
@@ -155,22 +208,31 @@ std::string ParseCommandLine(Args const& args, CommandLine& line) {
 
   std::size_t first = 0;
   if (!operands.empty()) {
-    for (TCommand command : {Cmd_Note, Cmd_Scale, Cmd_Key, Cmd_Symbol})
-      if (operands[0] == CommandName(command)) {
+    for (TCommand command : CommandList)
+      if (command != Cmd_Chord && operands[0] == CommandName(command)) {
         line.Command = command;
         first = 1;
       }
   }
   line.Operands.assign(operands.begin() + static_cast<std::ptrdiff_t>(first), operands.end());
 
-  for (GivenOption const& option : given) {
+  for (std::size_t k = 0; k < given.size(); ++k) {
+    GivenOption const& option = given[k];
     std::string stored;
     if ((option.Spec->Commands & line.Command) == 0)
       stored = std::string("option '") + option.Spec->Name + "' does not apply to this command";
     else
       stored = StoreOption(option, line);
+    // A value given again must be the same: the last one silently winning would
+    // hide a mistake.
+    for (std::size_t earlier = 0; earlier < k && stored.empty(); ++earlier)
+      if (given[earlier].Spec == option.Spec && given[earlier].Value != option.Value)
+        stored = std::string("option '") + option.Spec->Name + "' is given twice, as " + Quoted(given[earlier].Value) +
+                 " and as " + Quoted(option.Value);
     if (problem.empty()) problem = stored;
   }
+  if (problem.empty() && line.German != 0 && line.Solfege != 0)
+    problem = "options '--german' and '--solfege' do not go together";
   if (line.Help != 0 || line.Version != 0) return std::string();
   return problem;
 }
@@ -193,11 +255,17 @@ const char* const NoteNameOptionsHelp = "  --b-is-h            English names: B 
                                         "  --bb-is-b           English names: B flat written B; the letter B is read\n"
                                         "                      as B flat (with --b-is-h: the German pair H and B)\n";
 
-const char* const NameStyleOptionsHelp = "  --german            German names: Cis, Es, B, H\n"
-                                         "  --solfege           solmisation names: Do, Re, Mi, Fa, So, La, Ti\n";
+const char* const NameStyleOptionsHelp =
+    "  --german            German names: Cis, Es, B, H; notes and keys are read in\n"
+    "                      them too (Fis, es, As, B is B flat)\n"
+    "  --solfege           solmisation names: Do, Re, Mi, Fa, So, La, Ti; notes and\n"
+    "                      keys are read in them too (not with --german)\n";
 
 const char* const OctaveOptionHelp = "  --octave-of-60 3|4|5  octave number of note 60, middle C (default 3); used\n"
                                      "                      for reading and for writing note names\n";
+
+const char* const GeneralOptionsHelp = "  -h, --help          show this text\n"
+                                       "  --version           show the program's version\n";
 
 const char* const ChordNameOptionsHelp =
     "  --minor-small       minor chords begin with a small letter: c m 7\n"

@@ -1,5 +1,6 @@
 #include "JsonWriter.h"
 
+#include <charconv>
 #include <cstdio>
 
 // A value or a key needs a comma before it exactly when something was written at
@@ -40,6 +41,11 @@ void CJsonWriter::Int(long value) {
   Out_.append(digits, static_cast<std::size_t>(length));
 }
 
+void CJsonWriter::Fixed(double value, int decimals) {
+  BeforeValue();
+  AppendFixed(Out_, value, decimals);
+}
+
 void CJsonWriter::Bool(bool value) {
   BeforeValue();
   Out_ += value ? "true" : "false";
@@ -74,4 +80,11 @@ void AppendJsonString(std::string& out, std::string_view text) {
     }
   }
   out += '"';
+}
+
+void AppendFixed(std::string& out, double value, int decimals) {
+  // A double has at most 309 digits before the point.
+  char digits[400];
+  auto const written = std::to_chars(digits, digits + sizeof digits, value, std::chars_format::fixed, decimals);
+  if (written.ec == std::errc()) out.append(digits, written.ptr);
 }

@@ -26,6 +26,8 @@ public:
   void Key(std::string_view name);
   void String(std::string_view text);
   void Int(long value);
+  /// A number with exactly `decimals` digits after the point (0.500000).
+  void Fixed(double value, int decimals);
   void Bool(bool value);
   void Null();
 
@@ -40,5 +42,9 @@ private:
 
 /// Appends text as a JSON string, quotes included.
 void AppendJsonString(std::string& out, std::string_view text);
+
+/// Appends value with exactly `decimals` digits after the point, rounded, the same
+/// in every locale ("-0.250000", "12.500"); decimals 0 to 60.
+void AppendFixed(std::string& out, double value, int decimals);
 
 #endif

@@ -41,15 +41,12 @@ std::string NoteUsage() {
                      "and its name in English, German and solfege style.\n"
                      "\n"
                      "Options:\n") +
-         NoteNameOptionsHelp + OctaveOptionHelp;
+         NoteNameOptionsHelp + OctaveOptionHelp + GeneralOptionsHelp;
 }
 
 int RunNoteCommand(CommandLine const& line) {
   Args const& args = line.Operands;
-  if (args.empty()) {
-    std::fputs(NoteUsage().c_str(), stderr);
-    return 2;
-  }
+  if (args.empty()) return ShortUsage(Cmd_Note);
   std::vector<CNote> notes;
   for (std::string const& token : args) {
     CNote note;

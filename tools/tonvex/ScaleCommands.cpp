@@ -1,7 +1,9 @@
-// tonvex scale ROOT TYPE and tonvex key ROOT [minor]: scales and keys with their
-// spelled degrees and key signatures.
+// tonvex scale KEY [TYPE] and tonvex key KEY: scales and keys with their spelled
+// degrees and key signatures.
 #include "Commands.h"
+#include "KeyText.h"
 #include "NoteToken.h"
+#include "QuotedText.h"
 #include "SignsText.h"
 
 #include <tonvex/ChordnamePref.h>
@@ -37,29 +39,27 @@ std::string DegreeNames(CScale const& scale) {
   return names;
 }
 
-// Checks the operand count and reads the root, the first operand. Returns -1 when
-// the command should go on, else the exit status.
-int ReadRootArgs(CommandLine const& line, std::size_t least, std::size_t most, CNote& root) {
+// Reads the operands as one key ("F#", "minor" is "F# minor"). Returns -1 when the
+// command should go on, else the exit status.
+int ReadKeyArgs(CommandLine const& line, std::size_t most, CSignKey& key) {
   Args const& args = line.Operands;
-  if (args.size() < least) {
-    std::string usage = line.Command == Cmd_Scale ? ScaleUsage() : KeyUsage();
-    std::fputs(usage.c_str(), stderr);
-    return 2;
-  }
-  if (args.size() > most) return UsageError(line.Command, "unexpected argument '" + args[most] + "'");
-  TTokenProblem problem = ReadNoteName(args[0], root);
-  if (problem != Token_Ok) return UsageError(line.Command, TokenProblemText(problem, Kind_NoteName, args[0]));
+  if (args.empty()) return ShortUsage(line.Command);
+  if (args.size() > most) return UsageError(line.Command, "unexpected argument " + Quoted(args[most]));
+  std::string text = args[0];
+  for (std::size_t i = 1; i < args.size(); ++i) text += ' ' + args[i];
+  if (!ReadKey(text, key)) return UsageError(line.Command, KeyProblemText(text));
   return -1;
 }
 
 } // namespace
 
 std::string ScaleUsage() {
-  return std::string("usage: tonvex scale [OPTIONS] ROOT TYPE\n"
+  return std::string("usage: tonvex scale [OPTIONS] KEY [TYPE]\n"
                      "\n"
-                     "Prints the degrees of the scale of TYPE on ROOT, spelled as the scale spells them,\n"
-                     "and its key signature. ROOT is a note name as 'tonvex note' reads it (a letter\n"
-                     "A..H, an optional accidental bb, b, x or #; an octave is accepted and ignored).\n"
+                     "Prints the degrees of a scale, spelled as the scale spells them, and its key\n"
+                     "signature. KEY is read as 'tonvex key' reads it: its tonic is the scale's root\n"
+                     "and, without TYPE, its mode the scale's type (C, Cm, c, Bb major, f# minor);\n"
+                     "with TYPE, the scale of that type on the tonic (c harmonic-minor, Bb 1).\n"
                      "TYPE is a name or its number:\n"
                      "  0 other           spelled like major\n"
                      "  1 major\n"
@@ -72,43 +72,47 @@ std::string ScaleUsage() {
                      "Every type but minor is spelled and counts its signs like major.\n"
                      "\n"
                      "Options:\n") +
-         NameStyleOptionsHelp + NoteNameOptionsHelp;
+         NameStyleOptionsHelp + NoteNameOptionsHelp + GeneralOptionsHelp;
 }
 
 std::string KeyUsage() {
-  return std::string("usage: tonvex key [OPTIONS] ROOT [minor|major]\n"
+  return std::string("usage: tonvex key [OPTIONS] KEY\n"
                      "\n"
-                     "Prints the name of the major (default) or minor key on ROOT, its key signature\n"
-                     "and its degrees. ROOT is a note name as 'tonvex note' reads it.\n"
+                     "Prints the name of the key, its key signature and its degrees. KEY is a tonic\n"
+                     "(a note name without octave) with an optional mode, attached or after a blank:\n"
+                     "m, min or minor for minor, maj or major for major, the words in any case (C,\n"
+                     "Cm, F#m, Bb major, Cmaj, Cmin, C MINOR). Without a mode a tonic written with a\n"
+                     "small letter is minor (c, bb, f# minor as well). With --german German names\n"
+                     "are read too (Fis, fis, Es, es, B for B flat, H), with --solfege solfege names.\n"
+                     "The --key option of the chord command reads keys the same way.\n"
                      "\n"
                      "Options:\n") +
-         NameStyleOptionsHelp + NoteNameOptionsHelp;
+         NameStyleOptionsHelp + NoteNameOptionsHelp + GeneralOptionsHelp;
 }
 
 int RunScaleCommand(CommandLine const& line) {
-  CNote root;
-  int status = ReadRootArgs(line, 2, 2, root);
-  if (status >= 0) return status;
-  std::string const& typeName = line.Operands[1];
+  CSignKey key;
+  Args const& args = line.Operands;
   CScale::TType type = CScale::Scale_Major;
-  if (!ReadScaleType(typeName, type)) return UsageError(Cmd_Scale, "cannot read scale type '" + typeName + "'");
-  CScale const scale(root, type);
+  // KEY TYPE: the last operand is a type, the others the key whose tonic is taken.
+  bool const typed = args.size() >= 2 && ReadScaleType(args.back(), type);
+  if (!typed && args.size() == 2 && !ReadKey(args[0] + ' ' + args[1], key) && ReadKey(args[0], key))
+    return UsageError(Cmd_Scale, "cannot read scale type " + Quoted(args[1]));
+  CommandLine keyLine = line;
+  if (typed) keyLine.Operands.pop_back();
+  int status = ReadKeyArgs(keyLine, 2, key);
+  if (status >= 0) return status;
+  if (!typed) type = key.SignKeyType() == CSignKey::SignKey_Minor ? CScale::Scale_Minor : CScale::Scale_Major;
+  CScale const scale(key.RootNote(), type);
   std::printf("scale: %s %s\ndegrees: %s\nsigns: %s\n", scale.RootNote().KeyName(DefaultChordnamePref).c_str(),
               TypeNames[type], DegreeNames(scale).c_str(), SignsText(scale.SignsCount()).c_str());
   return 0;
 }
 
 int RunKeyCommand(CommandLine const& line) {
-  CNote root;
-  int status = ReadRootArgs(line, 1, 2, root);
+  CSignKey key;
+  int status = ReadKeyArgs(line, 2, key);
   if (status >= 0) return status;
-  Args const& args = line.Operands;
-  CSignKey::TType type = CSignKey::SignKey_Major;
-  if (args.size() == 2) {
-    if (args[1] != "minor" && args[1] != "major") return UsageError(Cmd_Key, "cannot read key type '" + args[1] + "'");
-    if (args[1] == "minor") type = CSignKey::SignKey_Minor;
-  }
-  CSignKey const key(root, type);
   std::printf("key: %s\nsigns: %s\ndegrees: %s\n", key.Name(DefaultChordnamePref).c_str(),
               SignsText(key.SignsCount()).c_str(), DegreeNames(key.Scale()).c_str());
   return 0;

@@ -1,37 +1,19 @@
 // tonvex symbol SYMBOL...: reads chord symbols (lead-sheet symbols and Harte labels)
 // and shows their notes; without symbols, reads one from every line of standard
 // input.
+#include "ChordNamer.h"
 #include "Commands.h"
 #include "JsonWriter.h"
+#include "LineLoop.h"
+#include "QuotedText.h"
 
 #include <tonvex/ChordSymbol.h>
 #include <tonvex/ChordnamePref.h>
 
 #include <cstdio>
-#include <iostream>
 #include <unistd.h>
 
 namespace {
-
-// A text quoted for a message: control bytes escaped as \xNN, cut after 40 bytes at
-// the start of a character.
-std::string Quoted(std::string_view text) {
-  static char const Hex[] = "0123456789abcdef";
-  std::string quoted = "'";
-  std::size_t end = text.size() > 40 ? 40 : text.size();
-  while (end < text.size() && (static_cast<unsigned char>(text[end]) & 0xC0) == 0x80) --end;
-  for (char c : text.substr(0, end)) {
-    auto const byte = static_cast<unsigned char>(c);
-    if (byte < 0x20 || byte == 0x7f || c == '\\') {
-      quoted += "\\x";
-      quoted += Hex[byte >> 4];
-      quoted += Hex[byte & 0xf];
-    } else {
-      quoted += c;
-    }
-  }
-  return quoted + (end < text.size() ? "...'" : "'");
-}
 
 std::string ProblemText(std::string_view symbol, CChordSymbolProblem const& problem) {
   return "cannot read chord symbol " + Quoted(symbol) + ": " + problem.Reason + " at offset " +
@@ -54,17 +36,6 @@ void AppendFacts(std::string& out, std::string_view symbol, CChord const& chord)
   out += ", root " + KeyName(chord.RootNote()) + ", bass " + KeyName(chord.LowestNote()) + '\n';
 }
 
-void AppendNote(CJsonWriter& json, char const* key, CNote const& note, bool defined) {
-  json.Key(key);
-  if (!defined) return json.Null();
-  json.BeginObject();
-  json.Key("name");
-  json.String(KeyName(note));
-  json.Key("key_number");
-  json.Int(note.NoteNr() % 12);
-  json.EndObject();
-}
-
 void AppendJson(std::string& out, std::string_view symbol, CChord const& chord, long lineNr) {
   CJsonWriter json(out);
   bool const defined = !chord.IsUndefined();
@@ -84,8 +55,8 @@ void AppendJson(std::string& out, std::string_view symbol, CChord const& chord, 
   if (defined)
     for (int keyNr : chord.KeyNrSet()) json.Int(keyNr);
   json.EndArray();
-  AppendNote(json, "root", chord.RootNote(), defined);
-  AppendNote(json, "bass", chord.LowestNote(), defined);
+  AppendJsonNote(json, "root", chord.RootNote(), defined);
+  AppendJsonNote(json, "bass", chord.LowestNote(), defined);
   json.EndObject();
   out += '\n';
 }
@@ -114,47 +85,25 @@ std::string_view SymbolOfLine(std::string_view line) {
   return line.substr(first, line.find_last_not_of(" \t\r") - first + 1);
 }
 
-bool Write(std::string const& text) { return std::fwrite(text.data(), 1, text.size(), stdout) == text.size(); }
-
-int Finish(int status) {
-  if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
-    std::fputs("tonvex symbol: cannot write the output\n", stderr);
-    return 1;
-  }
-  return status;
-}
-
-int ReadSymbolsOfLines(bool json) {
-  std::ios::sync_with_stdio(false);
-  bool const eachLine = isatty(STDOUT_FILENO) != 0;
-  std::string text, out;
-  long lineNr = 0;
-  int status = 0;
-  CChord chord;
-  while (std::getline(std::cin, text)) {
-    ++lineNr;
-    std::string_view const symbol = SymbolOfLine(text);
-    if (symbol.empty()) continue;
+// A symbol on every line.
+class CSymbolLines : public CLineHandler {
+public:
+  std::string Handle(std::string_view line, long lineNr, bool json, std::string& out,
+                     std::string_view& token) override {
+    std::string_view const symbol = SymbolOfLine(line);
+    if (symbol.empty()) return std::string();
     CChordSymbolProblem problem;
-    if (!ReadChordSymbol(symbol, chord, &problem)) {
-      std::fprintf(stderr, "tonvex symbol: line %ld: %s\n", lineNr, ProblemText(symbol, problem).c_str());
-      status = 1;
-      continue;
+    if (!ReadChordSymbol(symbol, Chord_, &problem)) {
+      token = symbol;
+      return ProblemText(symbol, problem);
     }
-    Append(out, symbol, chord, json, lineNr);
-    if (eachLine || out.size() >= (1 << 16)) {
-      if (!Write(out)) return Finish(1);
-      if (eachLine) std::fflush(stdout);
-      out.clear();
-    }
+    Append(out, symbol, Chord_, json, lineNr);
+    return std::string();
   }
-  if (std::cin.bad()) {
-    std::fputs("tonvex symbol: cannot read the standard input\n", stderr);
-    status = 1;
-  }
-  Write(out);
-  return Finish(status);
-}
+
+private:
+  CChord Chord_;
+};
 
 } // namespace
 
@@ -171,24 +120,25 @@ std::string SymbolUsage() {
                      "\n"
                      "Without SYMBOL, reads a symbol from every line of standard input ('#' at the\n"
                      "start or after a blank begins a comment, blank lines are skipped); a line\n"
-                     "that cannot be read is reported on standard error with its number and the\n"
-                     "other lines go on (exit status 1). A terminal is read only when '-' is given.\n"
+                     "that cannot be read is reported on standard error with its number (with\n"
+                     "--json also by an object {line, error, token} in its place) and the other\n"
+                     "lines go on (exit status 1). Each answer is written before the program waits\n"
+                     "for more input. A terminal is read only when '-' is given.\n"
                      "\n"
                      "Options:\n"
                      "  --json              write a JSON object per symbol: symbol, notes,\n"
-                     "                      pitch_classes, root and bass ({name, key_number})\n") +
-         NameStyleOptionsHelp + NoteNameOptionsHelp;
+                     "                      pitch_classes, root and bass ({name, key_number})\n"
+                     "  --line-buffered     write each line's answer at once\n") +
+         NameStyleOptionsHelp + NoteNameOptionsHelp + GeneralOptionsHelp;
 }
 
 int RunSymbolCommand(CommandLine const& line) {
   Args const& args = line.Operands;
   bool const json = line.Json != 0;
   if (args.empty() || (args.size() == 1 && args[0] == "-")) {
-    if (args.empty() && isatty(STDIN_FILENO) != 0) {
-      std::fputs(SymbolUsage().c_str(), stderr);
-      return 2;
-    }
-    return ReadSymbolsOfLines(json);
+    if (args.empty() && isatty(STDIN_FILENO) != 0) return ShortUsage(Cmd_Symbol);
+    CSymbolLines handler;
+    return RunLineLoop(handler, {Cmd_Symbol, json, line.LineBuffered != 0});
   }
   // Every symbol is read before any is shown, so that a bad one shows nothing.
   std::vector<CChord> chords(args.size());
@@ -198,6 +148,5 @@ int RunSymbolCommand(CommandLine const& line) {
   }
   std::string out;
   for (std::size_t i = 0; i < args.size(); ++i) Append(out, args[i], chords[i], json, 0);
-  Write(out);
-  return Finish(0);
+  return WriteOutput(Cmd_Symbol, out, 0);
 }

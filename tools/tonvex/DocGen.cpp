@@ -98,11 +98,11 @@ void WriteManPage(std::ostream& out) {
   }
 }
 
-// The words of a bash case pattern: "--key|--root".
-std::string Pattern(std::vector<std::string> const& words) {
-  std::string pattern;
-  for (std::string const& word : words) pattern += (pattern.empty() ? "" : "|") + word;
-  return pattern;
+// The words joined by sep: a bash case pattern "--key|--root" or a word list.
+std::string Joined(std::vector<std::string> const& words, char sep = '|') {
+  std::string joined;
+  for (std::string const& word : words) joined += (joined.empty() ? "" : std::string(1, sep)) + word;
+  return joined;
 }
 
 void WriteCompletion(std::ostream& out) {
@@ -120,28 +120,26 @@ void WriteCompletion(std::ostream& out) {
         continue;
       }
       std::string words = option.Choices;
-      for (char& c : words) c = c == '|' ? ' ' : c;
+      std::replace(words.begin(), words.end(), '|', ' ');
       choices << "  " << option.Name << ") COMPREPLY=($(compgen -W \"" << words << "\" -- \"$cur\")); return ;;\n";
     }
     options << "  " << (command == Cmd_Chord ? "chord" : CommandName(command)) << ") options=\"" << list << "\" ;;\n";
   }
-  std::string commandWords = Pattern(commands);
-  for (char& c : commandWords) c = c == '|' ? ' ' : c;
   out << "# bash completion of tonvex, generated from the program's option table.\n"
       << "_tonvex() {\n"
       << "  local cur=${COMP_WORDS[COMP_CWORD]} prev=${COMP_WORDS[COMP_CWORD - 1]} command=chord operands=0 i\n"
       << "  # The command word is the first operand; an option's value is no operand.\n"
       << "  for ((i = 1; i < COMP_CWORD; i++)); do\n"
       << "    case ${COMP_WORDS[i]} in\n"
-      << "    " << Pattern(valued) << ") ((i++)) ;;\n"
+      << "    " << Joined(valued) << ") ((i++)) ;;\n"
       << "    -*) ;;\n"
-      << "    " << Pattern(commands) << ") command=${COMP_WORDS[i]}; break ;;\n"
+      << "    " << Joined(commands) << ") command=${COMP_WORDS[i]}; break ;;\n"
       << "    *) operands=1; break ;;\n"
       << "    esac\n"
       << "  done\n"
       << "  # An option's value: its choices, else (complete -o default) file names.\n"
       << "  case $prev in\n"
-      << choices.str() << "  " << Pattern(freeText) << ") return ;;\n"
+      << choices.str() << "  " << Joined(freeText) << ") return ;;\n"
       << "  esac\n"
       << "  local options\n"
       << "  case $command in\n"
@@ -149,7 +147,7 @@ void WriteCompletion(std::ostream& out) {
       << "  if [[ $cur == -* ]]; then\n"
       << "    COMPREPLY=($(compgen -W \"$options\" -- \"$cur\"))\n"
       << "  elif [[ $command == chord && $operands == 0 ]]; then\n"
-      << "    COMPREPLY=($(compgen -W \"" << commandWords << "\" -- \"$cur\"))\n"
+      << "    COMPREPLY=($(compgen -W \"" << Joined(commands, ' ') << "\" -- \"$cur\"))\n"
       << "  fi\n"
       << "}\n"
       << "complete -o default -F _tonvex tonvex\n";

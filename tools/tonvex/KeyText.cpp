@@ -16,10 +16,7 @@ std::string_view Trimmed(std::string_view text) {
 }
 
 bool EqualsIgnoringCase(std::string_view text, std::string_view word) {
-  if (text.size() != word.size()) return false;
-  for (std::size_t i = 0; i < text.size(); ++i)
-    if ((text[i] >= 'A' && text[i] <= 'Z' ? text[i] - 'A' + 'a' : text[i]) != word[i]) return false;
-  return true;
+  return text.size() == word.size() && StartsWithIgnoringCase(text, word);
 }
 
 // The mode after the tonic. A capital M alone is not read: in chord symbols it means

@@ -60,13 +60,6 @@ std::vector<CNoteNameEntry> const& SolfegeNames() {
   return names;
 }
 
-bool StartsWithIgnoringCase(std::string_view text, std::string_view prefix) {
-  if (text.size() < prefix.size()) return false;
-  for (std::size_t i = 0; i < prefix.size(); ++i)
-    if (Lower(text[i]) != Lower(prefix[i])) return false;
-  return true;
-}
-
 // The length of the longest name of the table that text starts with, or 0.
 std::size_t ReadStyleName(std::string_view text, std::vector<CNoteNameEntry> const& names, CNote& note) {
   CNoteNameEntry const* best = nullptr;
@@ -94,6 +87,13 @@ std::size_t ReadEnglishName(std::string_view text, CNote& note) {
 }
 
 } // namespace
+
+bool StartsWithIgnoringCase(std::string_view text, std::string_view prefix) {
+  if (text.size() < prefix.size()) return false;
+  for (std::size_t i = 0; i < prefix.size(); ++i)
+    if (Lower(text[i]) != Lower(prefix[i])) return false;
+  return true;
+}
 
 std::string_view WithPlainSigns(std::string_view text, std::string& buffer) {
   static std::string_view const Signs[][2] = {

@@ -58,4 +58,7 @@ bool IsDecimalNumber(std::string_view token);
 /// The value of a token that IsDecimalNumber accepts, read the same in every locale.
 int DecimalValue(std::string_view token);
 
+/// Whether text starts with prefix, the ASCII letters compared in either case.
+bool StartsWithIgnoringCase(std::string_view text, std::string_view prefix);
+
 #endif

@@ -1,16 +1,11 @@
 // Root finding and naming keep no state outside the chord they work on: threads
 // that analyse chords at the same time get the answers one thread gets alone. The
 // ThreadSanitizer build (.ci/run) runs this test to find any data race on the way.
+#include "support/TestPrelude.h"
 #include "support/Voicings.h"
-#include <tonvex/Chord.h>
-
-#include <gtest/gtest.h>
 
 #include <atomic>
-#include <sstream>
-#include <string>
 #include <thread>
-#include <vector>
 
 namespace {
 

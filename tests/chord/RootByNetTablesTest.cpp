@@ -3,17 +3,12 @@
 // notes. Every answer must be what the net's own forward pass and the chord's
 // spelling operations give, for every pattern over every lowest pitch class, and
 // under Neuron parameters other than the built-in net's.
+#include "support/ChordBuilders.h"
 #include "support/NeuronParamGuard.h"
-#include <tonvex/Chord.h>
-#include <tonvex/ChordAnalysisNet.h>
-#include <tonvex/NeuronalNet.h>
-
-#include <gtest/gtest.h>
-
-#include <string>
-#include <vector>
 
 namespace {
+
+using chordtest::Members;
 
 int constexpr PatternCount = 1 << 11; // intervals 1..11 above the lowest note
 
@@ -66,8 +61,7 @@ TEST(RootByNetTables, EveryPatternOverEveryLowestNoteAsTheNetAndTheSpellingsGive
         ASSERT_TRUE(found.Notes() == expected.Notes());
         ASSERT_TRUE(found.RootNoteSpecified());
         ASSERT_EQ(found.LowestNoteLonely(), expected.LowestNoteLonely());
-        ASSERT_EQ(std::vector<int>(found.IntvlSet().begin(), found.IntvlSet().end()),
-                  std::vector<int>(expected.IntvlSet().begin(), expected.IntvlSet().end()));
+        ASSERT_EQ(Members(found.IntvlSet()), Members(expected.IntvlSet()));
       }
   }
 }

@@ -18,8 +18,10 @@ int NamedSpelling(int k, int e) {
 TEST(NoteNames, EveryKeyAndSpellingUnderEveryFlagCombination) {
   PrefGuard guard;
   for (int flags = 0; flags < 16; ++flags) {
+    using P = CChordnamePref;
     bool const roman = flags & 1, german = flags & 2, bbIsB = flags & 4, bIsH = flags & 8;
-    PrefGuard::NoteNaming(roman, german, bbIsB, bIsH);
+    std::tie(P::RomanNames, P::AccidentalsAsLetters, P::Bb_is_B, P::B_is_H) =
+        std::make_tuple(roman, german, bbIsB, bIsH);
     for (int k = -12; k < 24; ++k)
       for (int e = -1; e <= 5; ++e) {
         int const pc = oracle::Mod12(k), named = NamedSpelling(pc, e);

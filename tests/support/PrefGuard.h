@@ -23,12 +23,6 @@ class PrefGuard {
 public:
   ~PrefGuard() { NamingPrefRefs() = saved_; }
 
-  /// Sets the four note-naming flags at once.
-  static void NoteNaming(int roman, int german, int bbIsB, int bIsH) {
-    using P = CChordnamePref;
-    std::tie(P::RomanNames, P::AccidentalsAsLetters, P::Bb_is_B, P::B_is_H) = std::tie(roman, german, bbIsB, bIsH);
-  }
-
 private:
   decltype(Copied(NamingPrefRefs())) saved_ = Copied(NamingPrefRefs());
 };

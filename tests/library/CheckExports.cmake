@@ -3,21 +3,17 @@
 # leaks out) and every "require" pattern must match some symbol (the public API is
 # there).
 cmake_minimum_required(VERSION 3.25)
-execute_process(COMMAND "${NM}" -D --defined-only -C "${LIBRARY}" OUTPUT_VARIABLE listing RESULT_VARIABLE status)
+execute_process(COMMAND "${NM}" -D --defined-only -C --format=just-symbols "${LIBRARY}" OUTPUT_VARIABLE listing
+                RESULT_VARIABLE status OUTPUT_STRIP_TRAILING_WHITESPACE)
 if(NOT status EQUAL 0)
   message(FATAL_ERROR "nm failed on ${LIBRARY}")
 endif()
 string(REPLACE ";" "\\;" listing "${listing}")
-string(REPLACE "\n" ";" lines "${listing}")
+string(REPLACE "\n" ";" names "${listing}")
 file(STRINGS "${CMAKE_CURRENT_LIST_DIR}/ExportedSymbols.txt" rules REGEX "^(allow|require) ")
 set(unexpected)
 set(found_required)
-foreach(line IN LISTS lines)
-  # "<address> <type> <name>"
-  if(NOT line MATCHES "^[0-9a-f]+ [A-Za-z] (.*)$")
-    continue()
-  endif()
-  set(name "${CMAKE_MATCH_1}")
+foreach(name IN LISTS names)
   set(ok FALSE)
   foreach(rule IN LISTS rules)
     string(REGEX REPLACE "^(allow|require) " "" pattern "${rule}")

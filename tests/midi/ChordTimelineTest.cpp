@@ -36,12 +36,7 @@ std::string Timeline(Bytes const& bytes, CChordTimelineSettings const& settings 
 // Whole-bar block chords in the left hand.
 MidiTrackBytes BlockChords(std::vector<std::vector<int>> const& chords, std::uint32_t length = Bar) {
   MidiTrackBytes track;
-  for (auto const& chord : chords) {
-    track.Event(0, {0x90, chord[0], 80});
-    for (std::size_t i = 1; i < chord.size(); ++i) track.Event(0, {chord[i], 80});
-    track.Event(length, {chord[0], 0});
-    for (std::size_t i = 1; i < chord.size(); ++i) track.Event(0, {chord[i], 0});
-  }
+  for (auto const& chord : chords) track.Chord(0, chord, length);
   return track.End();
 }
 
@@ -66,106 +61,84 @@ MidiTrackBytes Melody() {
   return track.End();
 }
 
-TEST(ChordTimelineTest, BlockChordsWithAndWithoutMelody) {
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(CAmFG)})), CAmFGTimeline);
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(CAmFG), Melody()})), CAmFGTimeline);
-}
+struct TimelineCase {
+  const char* What;
+  Bytes Song;
+  std::string Expected;
+  CChordTimelineSettings Settings = {};
+};
 
-// A chorale in four voices, a chord on every beat: I IV V I | vi ii V7 I.
-TEST(ChordTimelineTest, ChordOnEveryBeat) {
+TEST(ChordTimelineTest, SongsAndTheirTimelines) {
+  // A chorale in four voices, a chord on every beat: I IV V I | vi ii V7 I.
   std::vector<std::vector<int>> const chorale = {{48, 64, 67, 72}, {41, 65, 69, 72}, {43, 62, 67, 71},
                                                  {48, 64, 67, 72}, {45, 64, 69, 72}, {38, 65, 69, 74},
                                                  {43, 65, 67, 71}, {36, 64, 67, 72}};
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), BlockChords(chorale, Beat)})),
-            "0.00-0.50 C  @1:1|0.50-1.00 F  @1:2|1.00-1.50 G  @1:3|1.50-2.00 C  @1:4|2.00-2.50 A m @2:1|"
-            "2.50-3.00 D m @2:2|3.00-3.50 G  7@2:3|3.50-4.00 C  @2:4|");
-}
-
-// Broken chords, one note per eighth over a bass held through the bar: C, F over C,
-// G7 (B F D F over G), C.
-TEST(ChordTimelineTest, Arpeggios) {
+  // Broken chords, one note per eighth over a bass held through the bar: C, F over
+  // C, G7 (B F D F over G), C.
   int const patterns[][5] = {{36, 60, 64, 67, 72}, {36, 60, 65, 69, 72}, {43, 59, 65, 62, 65}, {36, 60, 64, 67, 72}};
   MidiTrackBytes bass, broken;
   for (auto const& p : patterns) {
     bass.On(0, p[0], 80).Off(Bar, p[0]);
     for (int i = 0; i < 8; ++i) broken.On(0, p[1 + i % 4], 70, 1).Off(Beat / 2, p[1 + i % 4], 1);
   }
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), bass.End(), broken.End()})),
-            "0.00-2.00 C  @1:1|2.00-4.00 F  @2:1|4.00-6.00 G  7@3:1|6.00-8.00 C  @4:1|");
-}
-
-// 120 beats per minute for two bars, then 60: the third and fourth bars last four
-// seconds each.
-TEST(ChordTimelineTest, TempoChange) {
-  MidiTrackBytes conductor;
-  conductor.Tempo(0, 500000).TimeSig(0, 4, 2).Tempo(2 * Bar, 1000000).End();
-  EXPECT_EQ(Timeline(MidiFileBytes({conductor, BlockChords(CAmFG)})),
-            "0.00-2.00 C  @1:1|2.00-4.00 A m @2:1|4.00-8.00 F  @3:1|8.00-12.00 G  @4:1|");
-}
-
-// A bar of 4/4, then 3/4: the chords change every three beats and the bars follow.
-// On a bar grid a chord that starts on the second beat of a bar must wait for a bar
-// line: here the earlier one, where it lasts longer.
-TEST(ChordTimelineTest, TimeSignatureChangeAndBarGrid) {
-  MidiTrackBytes conductor;
-  conductor.Tempo(0, 500000).TimeSig(0, 4, 2).TimeSig(Bar, 3, 2).End();
-  EXPECT_EQ(Timeline(MidiFileBytes({conductor, BlockChords({{48, 55, 64}, {43, 59, 62}, {45, 52, 60}}, 3 * Beat)})),
-            "0.00-1.50 C  @1:1|1.50-3.00 G  @1:4|3.00-4.50 A m @2:3|");
-  MidiTrackBytes waltz;
+  MidiTrackBytes slower, meters, waltz, pedal, dry, late, shortF;
+  slower.Tempo(0, 500000).TimeSig(0, 4, 2).Tempo(2 * Bar, 1000000).End();
+  meters.Tempo(0, 500000).TimeSig(0, 4, 2).TimeSig(Bar, 3, 2).End();
   waltz.Tempo(0, 500000).TimeSig(0, 3, 2).Chord(0, {48, 55, 64}, 4 * Beat).Chord(0, {43, 59, 62}, 5 * Beat).End();
-  EXPECT_EQ(Timeline(MidiFileBytes({waltz})), "0.00-2.00 C  @1:1|2.00-4.50 G  @2:2|");
-  CChordTimelineSettings bars;
-  bars.Grid = ChordGrid_Bar;
-  EXPECT_EQ(Timeline(MidiFileBytes({waltz}), bars), "0.00-1.50 C  @1:1|1.50-4.50 G  @2:1|");
-}
-
-// A short chord held by the pedal for two beats sounds for them; after the pedal
-// and a beat of silence comes A minor. Without the pedal the chord ends with its
-// beat.
-TEST(ChordTimelineTest, SustainPedal) {
-  MidiTrackBytes track;
-  track.Pedal(0, true).Chord(0, {48, 55, 64}, Beat / 8).Pedal(2 * Beat - Beat / 8, false);
-  track.Chord(Beat, {45, 52, 60}, Beat).End();
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), track})), "0.00-1.00 C  @1:1|1.00-1.50 N@1:3|1.50-2.00 A m @1:4|");
-  MidiTrackBytes dry;
+  pedal.Pedal(0, true).Chord(0, {48, 55, 64}, Beat / 8).Pedal(2 * Beat - Beat / 8, false);
+  pedal.Chord(Beat, {45, 52, 60}, Beat).End();
   dry.Chord(0, {48, 55, 64}, Beat / 8).Chord(3 * Beat - Beat / 8, {45, 52, 60}, Beat).End();
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), dry})), "0.00-0.50 C  @1:1|0.50-1.50 N@1:2|1.50-2.00 A m @1:4|");
+  late.Event(Beat / 5, {0xff, 0x01, 0});
+  for (unsigned char b : BlockChords(CAmFG).Data) late.Data.push_back(b);
+  shortF.Chord(0, {48, 55, 64}, Bar).Chord(0, {48, 53, 57}, Bar / 2).Chord(0, {48, 55, 64}, Bar).End();
+  CChordTimelineSettings bars, joined;
+  bars.Grid = ChordGrid_Bar;
+  joined.MinDuration = 1.5;
+  TimelineCase const cases[] = {
+      {"block chords", MidiFileBytes({Conductor(), BlockChords(CAmFG)}), CAmFGTimeline},
+      {"melody over block chords", MidiFileBytes({Conductor(), BlockChords(CAmFG), Melody()}), CAmFGTimeline},
+      {"chorale", MidiFileBytes({Conductor(), BlockChords(chorale, Beat)}),
+       "0.00-0.50 C  @1:1|0.50-1.00 F  @1:2|1.00-1.50 G  @1:3|1.50-2.00 C  @1:4|2.00-2.50 A m @2:1|"
+       "2.50-3.00 D m @2:2|3.00-3.50 G  7@2:3|3.50-4.00 C  @2:4|"},
+      {"arpeggios", MidiFileBytes({Conductor(), bass.End(), broken.End()}),
+       "0.00-2.00 C  @1:1|2.00-4.00 F  @2:1|4.00-6.00 G  7@3:1|6.00-8.00 C  @4:1|"},
+      // 120 beats per minute for two bars, then 60: bars 3 and 4 last four seconds.
+      {"tempo change", MidiFileBytes({slower, BlockChords(CAmFG)}),
+       "0.00-2.00 C  @1:1|2.00-4.00 A m @2:1|4.00-8.00 F  @3:1|8.00-12.00 G  @4:1|"},
+      // A bar of 4/4, then 3/4: the chords change every three beats and the bars follow.
+      {"4/4 then 3/4", MidiFileBytes({meters, BlockChords({{48, 55, 64}, {43, 59, 62}, {45, 52, 60}}, 3 * Beat)}),
+       "0.00-1.50 C  @1:1|1.50-3.00 G  @1:4|3.00-4.50 A m @2:3|"},
+      // On a bar grid a chord that starts on the second beat of a bar must wait for
+      // a bar line: here the earlier one, where it lasts longer.
+      {"waltz on beats", MidiFileBytes({waltz}), "0.00-2.00 C  @1:1|2.00-4.50 G  @2:2|"},
+      {"waltz on bars", MidiFileBytes({waltz}), "0.00-1.50 C  @1:1|1.50-4.50 G  @2:1|", bars},
+      // A short chord held by the pedal for two beats sounds for them; after the pedal
+      // and a beat of silence comes A minor. Without the pedal it ends with its beat.
+      {"sustain pedal", MidiFileBytes({Conductor(), pedal}), "0.00-1.00 C  @1:1|1.00-1.50 N@1:3|1.50-2.00 A m @1:4|"},
+      {"no pedal", MidiFileBytes({Conductor(), dry}), "0.00-0.50 C  @1:1|0.50-1.50 N@1:2|1.50-2.00 A m @1:4|"},
+      {"empty track", MidiFileBytes({Conductor(), MidiTrackBytes().End()}), ""},
+      // Notes a fifth of a beat late throughout: the grid follows them, and the silence
+      // before the first is no chord.
+      {"late notes", MidiFileBytes({Conductor(), late}),
+       "0.00-0.10 N@0:4|0.10-2.10 C  @1:1|2.10-4.10 A m @2:1|4.10-6.10 F  @3:1|6.10-8.10 G  @4:1|"},
+      // A segment shorter than MinDuration joins its better neighbour: a beat of F
+      // over the bass C between two bars of C becomes C.
+      {"short F", MidiFileBytes({Conductor(), shortF}), "0.00-2.00 C  @1:1|2.00-3.00 F  @2:1|3.00-5.00 C  @2:3|"},
+      {"short F joined", MidiFileBytes({Conductor(), shortF}), "0.00-5.00 C  @1:1|", joined},
+  };
+  for (TimelineCase const& c : cases) EXPECT_EQ(Timeline(c.Song, c.Settings), c.Expected) << c.What;
 }
 
 // Drums on channel 10 (a kick on every beat would be the bass) are left out unless
 // asked for; an empty track changes nothing.
-TEST(ChordTimelineTest, DrumsAndEmptyTrack) {
+TEST(ChordTimelineTest, DrumsLeftOutUnlessAskedFor) {
   MidiTrackBytes drums;
   for (int i = 0; i < 16; ++i) drums.On(0, 36, 120, 9).Off(Beat, 36, 9);
-  MidiTrackBytes empty;
-  Bytes const song = MidiFileBytes({Conductor(), empty.End(), BlockChords(CAmFG), drums.End()});
+  Bytes const song = MidiFileBytes({Conductor(), MidiTrackBytes().End(), BlockChords(CAmFG), drums.End()});
   EXPECT_EQ(Timeline(song), CAmFGTimeline);
   CChordTimelineSettings withDrums;
   withDrums.IncludeDrums = true;
   EXPECT_NE(Timeline(song, withDrums), CAmFGTimeline);
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), empty})), "");
-}
-
-// Notes played a fifth of a beat late throughout: the grid follows them, so the
-// chords change where the notes do, and the silence before the first is no chord.
-TEST(ChordTimelineTest, GridFollowsTheOnsets) {
-  MidiTrackBytes late;
-  late.Event(Beat / 5, {0xff, 0x01, 0});
-  for (unsigned char b : BlockChords(CAmFG).Data) late.Data.push_back(b);
-  EXPECT_EQ(Timeline(MidiFileBytes({Conductor(), late})),
-            "0.00-0.10 N@0:4|0.10-2.10 C  @1:1|2.10-4.10 A m @2:1|4.10-6.10 F  @3:1|6.10-8.10 G  @4:1|");
-}
-
-// A segment shorter than MinDuration joins its better neighbour: a beat of F over
-// the bass C between two bars of C becomes C.
-TEST(ChordTimelineTest, MinDurationJoinsShortSegments) {
-  MidiTrackBytes track;
-  track.Chord(0, {48, 55, 64}, Bar).Chord(0, {48, 53, 57}, Bar / 2).Chord(0, {48, 55, 64}, Bar).End();
-  Bytes const song = MidiFileBytes({Conductor(), track});
-  EXPECT_EQ(Timeline(song), "0.00-2.00 C  @1:1|2.00-3.00 F  @2:1|3.00-5.00 C  @2:3|");
-  CChordTimelineSettings joined;
-  joined.MinDuration = 1.5;
-  EXPECT_EQ(Timeline(song, joined), "0.00-5.00 C  @1:1|");
 }
 
 // The analysis keeps no state outside its call: threads that analyse songs at the

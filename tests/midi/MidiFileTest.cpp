@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <string>
+#include <tuple>
 #include <vector>
 
 namespace {
@@ -17,21 +18,14 @@ CMidiFile Read(Bytes const& bytes) {
   return file;
 }
 
-struct NoteFact {
-  std::int64_t start, end;
-  int key, velocity, channel, track;
-};
+// Start, end, key, velocity, channel and track of each note.
+using NoteFact = std::tuple<std::int64_t, std::int64_t, int, int, int, int>;
 
 std::vector<NoteFact> Facts(CMidiFile const& file) {
   std::vector<NoteFact> facts;
   for (CMidiNote const& n : file.Notes)
-    facts.push_back({n.StartTick, n.EndTick, n.NoteNr, n.Velocity, n.Channel, n.TrackIx});
+    facts.emplace_back(n.StartTick, n.EndTick, n.NoteNr, n.Velocity, n.Channel, n.TrackIx);
   return facts;
-}
-
-bool operator==(NoteFact const& a, NoteFact const& b) {
-  return a.start == b.start && a.end == b.end && a.key == b.key && a.velocity == b.velocity && a.channel == b.channel &&
-         a.track == b.track;
 }
 
 // Running status across note-ons and velocity-0 note-offs, a note-off as 0x80 with a
@@ -58,20 +52,14 @@ TEST(MidiFileTest, KeepsTempoMeterKeyAndPedal) {
   track.Tempo(0, 600000).TimeSig(0, 6, 3).Meta(0, 0x59, {0xfd, 1}).Pedal(480, true, 2).Pedal(480, false, 2);
   track.Event(0, {0xb2, 64, 63}).Tempo(0, 400000).End();
   CMidiFile const file = Read(MidiFileBytes({track}, 0, 96));
-  EXPECT_EQ(file.Format, 0);
-  EXPECT_EQ(file.TicksPerQuarter, 96);
-  ASSERT_EQ(file.Tempos.size(), 2u);
-  EXPECT_EQ(file.Tempos[1].MicrosPerQuarter, 400000);
-  EXPECT_EQ(file.Tempos[1].Tick, 960);
-  ASSERT_EQ(file.TimeSigs.size(), 1u);
-  EXPECT_EQ(file.TimeSigs[0].Numerator, 6);
-  ASSERT_EQ(file.KeySigs.size(), 1u);
-  EXPECT_EQ(file.KeySigs[0].Sharps, -3);
-  EXPECT_TRUE(file.KeySigs[0].Minor);
-  ASSERT_EQ(file.Pedals.size(), 3u);
-  EXPECT_TRUE(file.Pedals[0].Down);
-  EXPECT_FALSE(file.Pedals[2].Down);
-  EXPECT_EQ(file.Pedals[1].Channel, 2);
+  ASSERT_EQ(std::make_tuple(file.Tempos.size(), file.TimeSigs.size(), file.KeySigs.size(), file.Pedals.size()),
+            std::make_tuple(2u, 1u, 1u, 3u));
+  // Format and division, the second tempo, 6/8, E flat minor; the pedal goes down
+  // and up on channel index 2, and a value of 63 is up.
+  EXPECT_EQ(std::make_tuple(file.Format, file.TicksPerQuarter, file.Tempos[1].Tick, file.Tempos[1].MicrosPerQuarter,
+                            file.TimeSigs[0].Numerator, file.KeySigs[0].Sharps, file.KeySigs[0].Minor,
+                            file.Pedals[0].Down, file.Pedals[1].Channel, file.Pedals[2].Down),
+            std::make_tuple(0, 96, 960, 400000, 6, -3, true, true, 2, false));
 }
 
 struct Broken {

@@ -60,20 +60,11 @@ public:
   MidiTrackBytes& End(std::uint32_t delta = 0) { return Meta(delta, 0x2f, {}); }
   /// Notes of one chord at once, held for length ticks (note-off as note-on with
   /// velocity 0, in running status).
-  MidiTrackBytes& Chord(std::uint32_t delta, std::initializer_list<int> keys, std::uint32_t length, int channel = 0) {
-    bool first = true;
-    for (int key : keys) {
-      if (first)
-        Event(delta, {0x90 | channel, key, 90});
-      else
-        Event(0, {key, 90});
-      first = false;
-    }
-    first = true;
-    for (int key : keys) {
-      Event(first ? length : 0, {key, 0});
-      first = false;
-    }
+  MidiTrackBytes& Chord(std::uint32_t delta, std::vector<int> const& keys, std::uint32_t length, int channel = 0) {
+    Event(delta, {0x90 | channel, keys[0], 90});
+    for (std::size_t i = 1; i < keys.size(); ++i) Event(0, {keys[i], 90});
+    Event(length, {keys[0], 0});
+    for (std::size_t i = 1; i < keys.size(); ++i) Event(0, {keys[i], 0});
     return *this;
   }
 

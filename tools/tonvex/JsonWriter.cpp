@@ -46,11 +46,6 @@ void CJsonWriter::Fixed(double value, int decimals) {
   AppendFixed(Out_, value, decimals);
 }
 
-void CJsonWriter::Bool(bool value) {
-  BeforeValue();
-  Out_ += value ? "true" : "false";
-}
-
 void CJsonWriter::Null() {
   BeforeValue();
   Out_ += "null";

@@ -28,7 +28,6 @@ public:
   void Int(long value);
   /// A number with exactly `decimals` digits after the point (0.500000).
   void Fixed(double value, int decimals);
-  void Bool(bool value);
   void Null();
 
 private:

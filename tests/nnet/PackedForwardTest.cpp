@@ -121,7 +121,6 @@ TEST_F(PackedForwardTest, FollowsTheWeightsAndTheProcessWideParameters) {
     EXPECT_EQ(Bits(net.get_outputs()), Bits(CalcVecOutputs(shape, Weights(net), in))) << after;
   };
   NeuronalNet net(shape);
-  expect(net, "construction");
   SetWeights(net, RandomValues(random, WeightCount(shape), false));
   expect(net, "acquire_weights");
   std::ostringstream list;

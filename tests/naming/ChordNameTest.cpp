@@ -20,7 +20,6 @@ std::string Names(CChord const& chord) {
 TEST(ChordName, DefaultPreferences) {
   std::pair<std::vector<long>, char const*> const cases[] = {
       {{60, 64, 67}, "|  |C  |C  |C  |"},
-      {{60, 64, 67, 71}, "|  ma7|C  ma7|C  ma7|C  ma7|"},
       {{60, 65, 67, 70}, "| 7 sus 4|C 7 sus 4|C 7 sus 4|C 7 sus 4|"},
       {{60, 62, 67, 71}, "| ma7 sus 2|C ma7 sus 2|C ma7 sus 2|C ma7 sus 2|"},
       {{60, 64, 68}, "| aug |C aug |C aug |C aug |"},
@@ -35,8 +34,7 @@ TEST(ChordName, DefaultPreferences) {
       {{51, 60, 67, 72}, "| m |C m |C m  / Eb|C m  / Eb|"},
       {{50, 60, 64, 67, 70}, "|  7|C  7|C  7 / D|C  7 / D|"},
       {{49, 60, 64, 67}, "|  |C  |C   / Db|C   / Db|"},
-      {{54, 60, 64, 67, 70}, "|  7|C  7|C  7 / F#|C  7 / F#|"},
-      {{60, 64, 67, 70, 74}, "|  7/9|C  7/9|C  7/9|C  7/9|"}};
+      {{54, 60, 64, 67, 70}, "|  7|C  7|C  7 / F#|C  7 / F#|"}};
   for (auto const& [notes, names] : cases) EXPECT_EQ(Names(NotesThenRoot(Nat(60), notes)), names);
   EXPECT_EQ(Names(NotesThenRoot(Nat(57), {60, 64, 67})), "| m 7|A m 7|A m 7 / C|A m 7|"); // a root not among the notes
   for (int bc : {8, 100, -1})

@@ -1,6 +1,7 @@
 // The generated source of the built-in net's data: the shipped file is exactly what
-// the writer makes of the compiled-in weights, its weights read back unchanged, and
-// weights are fitted to the text formats.
+// the writer makes of the compiled-in weights, and weights are fitted to the text
+// formats. (The written definitions are checked with the training agent's output,
+// reading them back in NetTextLocaleTest.)
 #include "training/ChordNetSource.h"
 #include "support/NeuronParamGuard.h"
 
@@ -28,12 +29,7 @@ TEST(ChordNetSource, ShippedFileIsTheWritersTextOfTheCompiledWeights) {
   }
   EXPECT_EQ(ChordNetSource(net, lines), shipped);
   EXPECT_EQ(shipped.compare(0, 20, "// clang-format off\n"), 0) << "formatting would change the text";
-  EXPECT_NE(shipped.find("\nTONVEX_API float weight_definitions[] =\n{\n-12.8459, 84.8939, "), std::string::npos);
-  EXPECT_NE(shipped.find("\nTONVEX_API TPredefinedWeights ChordAnalysisNeuronalNet = \n"), std::string::npos);
   EXPECT_EQ(shipped.find("Network Properties"), std::string::npos) << "the report and the time stay out";
-  std::vector<float> const read = WeightsOfChordNetSource(shipped);
-  ASSERT_EQ(read.size(), 765u);
-  EXPECT_EQ(std::memcmp(read.data(), weight_definitions, sizeof weight_definitions), 0);
   EXPECT_TRUE(WeightsOfChordNetSource("no definitions here").empty());
 }
 
